@@ -1,0 +1,44 @@
+# The flags every target of the project is built with, and the two functions that declare targets.
+
+add_library(keyprobe_flags INTERFACE)
+target_compile_features(keyprobe_flags INTERFACE cxx_std_20)
+target_include_directories(keyprobe_flags INTERFACE "${PROJECT_SOURCE_DIR}")
+target_compile_options(
+  keyprobe_flags
+  INTERFACE -Wall -Wextra -Wpedantic -Wconversion -Wsign-conversion -Wshadow -Wformat=2
+            -Wold-style-cast -Wnon-virtual-dtor -Woverloaded-virtual
+            # Failure reports name source files by their path from the repository root.
+            "-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=")
+if(KEYPROBE_WERROR)
+  target_compile_options(keyprobe_flags INTERFACE -Werror)
+endif()
+if(KEYPROBE_SANITIZE)
+  target_compile_options(keyprobe_flags INTERFACE "-fsanitize=${KEYPROBE_SANITIZE}"
+                                                  -fno-sanitize-recover=all -fno-omit-frame-pointer)
+  target_link_options(keyprobe_flags INTERFACE "-fsanitize=${KEYPROBE_SANITIZE}")
+endif()
+if(KEYPROBE_COVERAGE)
+  target_compile_options(keyprobe_flags INTERFACE --coverage)
+  target_link_options(keyprobe_flags INTERFACE --coverage)
+endif()
+
+# keyprobe_library(NAME SOURCES ... HEADERS ... LINK ...): one static library per folder. Each header
+# is compiled on its own too, so that none depends on what was included before it.
+function(keyprobe_library name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;HEADERS;LINK" ${ARGN})
+  add_library(${name} STATIC ${ARG_SOURCES})
+  target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS "${PROJECT_SOURCE_DIR}" FILES
+                                ${ARG_HEADERS})
+  set_target_properties(${name} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
+  target_link_libraries(${name} PUBLIC keyprobe_flags ${ARG_LINK})
+endfunction()
+
+# keyprobe_program(NAME SOURCES ... LINK ...): a program that users start.
+function(keyprobe_program name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;LINK" ${ARGN})
+  add_executable(${name} ${ARG_SOURCES})
+  target_link_libraries(${name} PRIVATE keyprobe_flags ${ARG_LINK})
+  if(KEYPROBE_STATIC)
+    target_link_options(${name} PRIVATE -static)
+  endif()
+endfunction()

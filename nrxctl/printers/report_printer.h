@@ -1,0 +1,15 @@
+// What every report printer is.
+#pragma once
+
+#include <cstdint>
+#include <string_view>
+
+#include "platform/bytes.h"
+
+namespace nrx {
+
+// Prints one report of a service on standard output. A report without bytes prints nothing.
+using report_printer = void (*)(std::string_view service_name, std::int32_t report_id,
+                                platform::byte_view report);
+
+}  // namespace nrx

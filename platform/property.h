@@ -1,0 +1,80 @@
+// Property values of the driver registry: numbers, texts, arrays and dictionaries.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <initializer_list>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <variant>
+#include <vector>
+
+namespace platform {
+
+class property;
+struct dictionary_entry;
+
+using array = std::vector<property>;
+
+// Keys with their values, in the order in which the keys were first set. Copies are deep.
+class dictionary {
+public:
+    dictionary();
+    dictionary(std::initializer_list<dictionary_entry> entries);
+    dictionary(const dictionary& other);
+    dictionary(dictionary&& other) noexcept;
+    dictionary& operator=(const dictionary& other);
+    dictionary& operator=(dictionary&& other) noexcept;
+    ~dictionary();
+
+    // Sets the value of a key, replacing an earlier one.
+    void set(std::string_view key, property value);
+
+    // The value of a key, owned by the dictionary; null if the key is not there.
+    [[nodiscard]] const property* find(std::string_view key) const;
+
+    [[nodiscard]] const std::vector<dictionary_entry>& entries() const { return entries_; }
+
+private:
+    std::vector<dictionary_entry> entries_;
+};
+
+// One value. Plain value semantics: a copy shares nothing with its source.
+class property {
+public:
+    property(std::int32_t value) : value_(value) {}
+    property(std::int64_t value) : value_(value) {}
+    property(std::string value) : value_(std::move(value)) {}
+    property(std::string_view value) : value_(std::string(value)) {}
+    property(const char* value) : value_(std::string(value)) {}
+    property(array value) : value_(std::move(value)) {}
+    property(dictionary value) : value_(std::move(value)) {}
+
+    // The value of a number of either width; none for anything else.
+    [[nodiscard]] std::optional<std::int64_t> number() const;
+
+    // The value if it is of that kind, owned by the property; null otherwise.
+    [[nodiscard]] const std::string* text() const { return std::get_if<std::string>(&value_); }
+    [[nodiscard]] const array* items() const { return std::get_if<array>(&value_); }
+    [[nodiscard]] const dictionary* entries() const { return std::get_if<dictionary>(&value_); }
+
+private:
+    std::variant<std::int32_t, std::int64_t, std::string, array, dictionary> value_;
+};
+
+struct dictionary_entry {
+    std::string key;
+    property value;
+};
+
+// Whether two values are the same: numbers by value whatever their width, arrays item by item,
+// dictionaries key by key in any order.
+bool same_value(const property& a, const property& b);
+
+// The value as text on one line: numbers in decimal, texts in double quotes, arrays as (a, b),
+// dictionaries as {key = value; key = value}.
+std::string describe(const property& value);
+
+}  // namespace platform

@@ -1,0 +1,46 @@
+// What stands behind a registry entry: the kernel's side of a connection.
+#pragma once
+
+#include <cstdint>
+
+#include "platform/connection.h"
+
+namespace platform::simulated {
+
+// A driver answers as a kernel driver would, and checks what it is sent as strictly.
+class driver {
+public:
+    driver() = default;
+    driver(const driver&) = delete;
+    driver& operator=(const driver&) = delete;
+    driver(driver&&) = delete;
+    driver& operator=(driver&&) = delete;
+    virtual ~driver() = default;
+
+    // Whether a connection of this type may be opened; type 0 unless a driver says otherwise.
+    virtual return_code open(std::uint32_t type);
+
+    // One method call. On success the spans of outputs are cut to what was returned.
+    virtual return_code call(std::uint32_t selector, const call_inputs& inputs,
+                             call_outputs& outputs) = 0;
+};
+
+// Whether a method takes or gives a structure.
+enum class presence { none, optional, required };
+
+// What a driver's method takes and gives, checked before the method runs.
+struct method_shape {
+    std::size_t scalars_in;
+    presence structure_in;
+    std::size_t scalars_out;
+    presence structure_out;
+};
+
+// success if the arguments have the method's shape, else bad_argument.
+return_code check_shape(const method_shape& shape, const call_inputs& inputs,
+                        const call_outputs& outputs);
+
+// Answers with reply in the structure output and cuts it to size; no_room if it is too small.
+return_code answer(byte_view reply, call_outputs& outputs);
+
+}  // namespace platform::simulated

@@ -1,0 +1,24 @@
+// One entry of the virtual host's driver registry.
+#pragma once
+
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "platform/property.h"
+#include "platform/virtual/driver.h"
+#include "platform/virtual/hid_unit.h"
+
+namespace platform::simulated {
+
+struct entry {
+    std::string name;                                   // registry name
+    std::vector<std::string> classes = {};              // its class, then the bases of that class
+    dictionary properties = {};                         // ids, locations, usages
+    std::shared_ptr<driver> unit = nullptr;             // null: nothing to open here
+    std::shared_ptr<hid_unit> hid = nullptr;            // null: no HID device
+    std::vector<std::shared_ptr<entry>> children = {};  // in the service plane
+    bool present = true;                                // false once the service is gone
+};
+
+}  // namespace platform::simulated

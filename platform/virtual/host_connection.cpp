@@ -1,0 +1,85 @@
+// Connections of the virtual host.
+
+#include <string>
+
+#include "platform/connection.h"
+#include "platform/virtual/machine.h"
+
+namespace platform {
+
+using simulated::current_machine;
+using simulated::entry_ref;
+using simulated::failure;
+using simulated::machine;
+
+namespace {
+
+std::string name_of(const entry_ref& provider) {
+    return provider ? provider->name : "nothing";
+}
+
+std::string hexadecimal(std::uint64_t value) {
+    constexpr std::string_view digits = "0123456789abcdef";
+    std::string text;
+    do {
+        text.insert(text.begin(), digits[value % 16]);
+        value /= 16;
+    } while (value != 0);
+    return "0x" + text;
+}
+
+// The call in the words of the log: "call NAME SELECTOR scalars [..] in [..] results N room N".
+std::string describe_call(const entry_ref& provider, std::uint32_t selector,
+                          const call_inputs& inputs, const call_outputs& outputs) {
+    std::string text = "call " + name_of(provider) + " " + std::to_string(selector) + " scalars [";
+    for (const std::uint64_t scalar : inputs.scalars) {
+        if (text.back() != '[') text += ' ';
+        text += hexadecimal(scalar);
+    }
+    text += "] in [";
+    constexpr std::string_view digits = "0123456789abcdef";
+    for (const std::uint8_t byte : inputs.structure) {
+        if (text.back() != '[') text += ' ';
+        text += digits[byte / 16];
+        text += digits[byte % 16];
+    }
+    return text + "] results " + std::to_string(outputs.scalars.size()) + " room " +
+           std::to_string(outputs.structure.size());
+}
+
+}  // namespace
+
+void connection_kind::release(handle_id id) {
+    machine& host = current_machine();
+    host.note([&] { return "close " + name_of(host.connection(id)); });
+    host.take_back(id);
+}
+
+return_code open(const service& provider, std::uint32_t type, connection& opened) {
+    machine& host = current_machine();
+    const entry_ref entry = host.service(provider.id());
+    const auto how =
+        host.begin_call([&] { return "open " + name_of(entry) + " type " + std::to_string(type); });
+    if (how) return code_of(*how);
+    if (!entry || !entry->present) return not_found;
+    if (!entry->unit) return unsupported;
+    const return_code result = entry->unit->open(type);
+    if (result == success) opened = connection(host.lend_connection(entry));
+    return result;
+}
+
+return_code call(const connection& connected, std::uint32_t selector, const call_inputs& inputs,
+                 call_outputs& outputs) {
+    machine& host = current_machine();
+    const entry_ref provider = host.connection(connected.id());
+    const auto how =
+        host.begin_call([&] { return describe_call(provider, selector, inputs, outputs); });
+    if (how) {
+        if (*how == failure::nothing) outputs.structure = {};
+        return code_of(*how);
+    }
+    if (!provider || !provider->present) return not_found;
+    return provider->unit->call(selector, inputs, outputs);
+}
+
+}  // namespace platform

@@ -1,0 +1,84 @@
+// HID device objects of the virtual host.
+
+#include <algorithm>
+#include <string>
+
+#include "platform/hid_device.h"
+#include "platform/virtual/machine.h"
+
+namespace platform {
+
+using simulated::current_machine;
+using simulated::entry_ref;
+using simulated::failure;
+using simulated::hid_object;
+using simulated::machine;
+
+namespace {
+
+std::string name_of(const hid_object* object) {
+    return object != nullptr ? object->provider->name : "nothing";
+}
+
+}  // namespace
+
+void hid_device_kind::release(handle_id id) {
+    machine& host = current_machine();
+    host.note([&] { return "release hid device " + name_of(host.hid_device(id)); });
+    host.take_back(id);
+}
+
+hid_device create_hid_device(const service& provider) {
+    machine& host = current_machine();
+    const entry_ref entry = host.service(provider.id());
+    const auto how =
+        host.begin_call([&] { return "create hid device " + (entry ? entry->name : "nothing"); });
+    if (how || !entry || !entry->present || !entry->hid) return {};
+    return hid_device(host.lend_hid_device(entry));
+}
+
+return_code open(const hid_device& device) {
+    machine& host = current_machine();
+    hid_object* object = host.hid_device(device.id());
+    if (const auto how = host.begin_call([&] { return "open hid device " + name_of(object); })) {
+        return code_of(*how);
+    }
+    if (object == nullptr || !object->provider->present) return not_found;
+    object->is_open = true;
+    return success;
+}
+
+return_code feature_report(const hid_device& device, std::uint8_t report_id, byte_span& report) {
+    machine& host = current_machine();
+    const hid_object* object = host.hid_device(device.id());
+    const auto how = host.begin_call([&] {
+        return "feature report of " + name_of(object) + " " + std::to_string(report_id) + " room " +
+               std::to_string(report.size());
+    });
+    if (how) {
+        if (*how == failure::nothing) report = {};
+        return code_of(*how);
+    }
+    if (object == nullptr || !object->provider->present) return not_found;
+    if (!object->is_open) return bad_argument;
+    const auto* bytes = object->provider->hid->feature_report(report_id);
+    if (bytes == nullptr) return unsupported;
+    if (bytes->size() > report.size()) return bad_argument;
+    std::copy(bytes->begin(), bytes->end(), report.begin());
+    report = report.first(bytes->size());
+    return success;
+}
+
+return_code close(const hid_device& device) {
+    machine& host = current_machine();
+    hid_object* object = host.hid_device(device.id());
+    if (const auto how = host.begin_call([&] { return "close hid device " + name_of(object); })) {
+        if (object != nullptr) object->is_open = false;
+        return code_of(*how);
+    }
+    if (object == nullptr || !object->is_open) return bad_argument;
+    object->is_open = false;
+    return success;
+}
+
+}  // namespace platform

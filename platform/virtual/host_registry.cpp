@@ -1,0 +1,90 @@
+// The registry of the virtual host.
+
+#include <algorithm>
+#include <utility>
+
+#include "platform/registry.h"
+#include "platform/virtual/machine.h"
+#include "platform/virtual/matching.h"
+
+namespace platform {
+
+using simulated::current_machine;
+using simulated::entry_ref;
+using simulated::failure;
+using simulated::machine;
+
+namespace {
+
+constexpr std::size_t longest_entry_name = 127;
+
+std::string name_of(const entry_ref& entry) {
+    return entry ? entry->name : "nothing";
+}
+
+}  // namespace
+
+void service_kind::release(handle_id id) {
+    current_machine().take_back(id);
+}
+
+dictionary matching_class(std::string_view class_name) {
+    return {{std::string(provider_class_key), class_name}};
+}
+
+service first_match(const dictionary& matching) {
+    machine& host = current_machine();
+    if (host.begin_call([&] { return "first match " + describe(matching); })) return {};
+    const auto found = std::find_if(
+        host.entries().begin(), host.entries().end(),
+        [&](const entry_ref& candidate) { return simulated::matches(*candidate, matching); });
+    return found == host.entries().end() ? service() : service(host.lend_service(*found));
+}
+
+service first_child(const service& parent, std::string_view plane) {
+    machine& host = current_machine();
+    const entry_ref entry = host.service(parent.id());
+    if (host.begin_call([&] { return "first child of " + name_of(entry); })) return {};
+    if (!entry || !entry->present || plane != service_plane) return {};
+    const auto child = std::find_if(entry->children.begin(), entry->children.end(),
+                                    [](const entry_ref& one) { return one->present; });
+    return child == entry->children.end() ? service() : service(host.lend_service(*child));
+}
+
+return_code entry_name(const service& entry, std::string& name) {
+    machine& host = current_machine();
+    const entry_ref named = host.service(entry.id());
+    if (const auto how = host.begin_call([&] { return "name of " + name_of(named); })) {
+        if (*how == failure::nothing) name.clear();
+        return code_of(*how);
+    }
+    if (!named || !named->present) return not_found;
+    name = named->name.substr(0, longest_entry_name);
+    return success;
+}
+
+std::optional<property> read_property(const service& entry, std::string_view name) {
+    machine& host = current_machine();
+    const entry_ref owner = host.service(entry.id());
+    if (host.begin_call(
+            [&] { return "property of " + name_of(owner) + " " + std::string(name); })) {
+        return std::nullopt;
+    }
+    const property* value = owner && owner->present ? owner->properties.find(name) : nullptr;
+    return value == nullptr ? std::nullopt : std::optional(*value);
+}
+
+return_code set_property(const service& entry, std::string_view name, const property& value) {
+    machine& host = current_machine();
+    const entry_ref owner = host.service(entry.id());
+    const auto how = host.begin_call([&] {
+        return "set property of " + name_of(owner) + " " + std::string(name) + " = " +
+               describe(value);
+    });
+    if (how) return code_of(*how);
+    if (!owner || !owner->present) return not_found;
+    owner->properties.set(name, value);
+    return success;
+}
+
+}  // namespace platform

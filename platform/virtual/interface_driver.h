@@ -1,0 +1,55 @@
+// The driver behind an interface service: reports, commands and named properties.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <map>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "platform/virtual/driver.h"
+
+namespace platform::simulated {
+
+using byte_list = std::vector<std::uint8_t>;
+
+// Answers the command channel of an interface service from maps. What is written reads back: a
+// written report, a set property.
+class interface_driver : public driver {
+public:
+    // Carries out a command: the payload goes in, the reply comes out.
+    using command = std::function<return_code(byte_view payload, byte_list& reply)>;
+
+    // Gives the service a report; only reports that it has can be read or written.
+    void set_report(std::uint32_t id, byte_list bytes) { reports_[id] = std::move(bytes); }
+
+    // Takes a report away again.
+    void drop_report(std::uint32_t id) { reports_.erase(id); }
+
+    // The bytes of a report as they now stand; null if the service has no such report.
+    [[nodiscard]] const byte_list* report(std::uint32_t id) const;
+
+    // Gives the service a command; any other command is unsupported.
+    void set_command(std::uint32_t code, command run) { commands_[code] = std::move(run); }
+
+    // Lets the service take and give named properties, and sets one.
+    void set_named_property(std::string_view name, byte_list value);
+
+    return_code call(std::uint32_t selector, const call_inputs& inputs,
+                     call_outputs& outputs) override;
+
+private:
+    return_code write_report(const call_inputs& inputs, call_outputs& outputs);
+    return_code read_report(const call_inputs& inputs, call_outputs& outputs);
+    return_code run_command(const call_inputs& inputs, call_outputs& outputs);
+    return_code write_named_property(const call_inputs& inputs, call_outputs& outputs);
+    return_code read_named_property(const call_inputs& inputs, call_outputs& outputs);
+
+    std::map<std::uint32_t, byte_list> reports_;
+    std::map<std::uint32_t, command> commands_;
+    std::map<std::string, byte_list, std::less<>> named_properties_;
+    bool has_named_properties_ = false;
+};
+
+}  // namespace platform::simulated

@@ -1,0 +1,126 @@
+// A virtual host: its registry, what it has lent out, and what it was asked.
+#pragma once
+
+#include <functional>
+#include <map>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "platform/handle.h"
+#include "platform/virtual/entry.h"
+#include "platform/virtual/failure.h"
+
+namespace platform::simulated {
+
+using entry_ref = std::shared_ptr<entry>;
+
+// A HID device object that a client holds.
+struct hid_object {
+    entry_ref provider;
+    bool is_open = false;
+};
+
+class machine {
+public:
+    // Registers an entry, as a child of parent if one is given, and returns it.
+    entry_ref add(entry described, const entry_ref& parent = nullptr);
+
+    // The first present entry with a registry name; null if there is none.
+    [[nodiscard]] entry_ref find(std::string_view name) const;
+
+    // Takes a service away, as when its driver goes down: look-ups no longer see it, and what is
+    // open on it fails with not_found.
+    void remove(std::string_view name);
+
+    // All entries in registration order, those that are gone included.
+    [[nodiscard]] const std::vector<entry_ref>& entries() const { return entries_; }
+
+    // --- what is lent out ---
+
+    handle_id lend_service(entry_ref provider);
+    handle_id lend_connection(entry_ref provider);
+    handle_id lend_hid_device(entry_ref provider);
+
+    // The entry behind a service, the provider of a connection, a HID device object; null if there
+    // is no such handle.
+    [[nodiscard]] entry_ref service(handle_id id) const;
+    [[nodiscard]] entry_ref connection(handle_id id) const;
+    [[nodiscard]] hid_object* hid_device(handle_id id);
+
+    // Takes a handle back, of whichever kind.
+    void take_back(handle_id id);
+
+    // How many handles of all kinds are out, and HID devices still open.
+    [[nodiscard]] std::size_t open_handles() const;
+
+    // --- what was asked ---
+
+    // Every platform call that can fail starts here: it is counted and logged in the words that
+    // describe_call gives. Returns how the call is to fail, if it is.
+    template <class Describe>
+    std::optional<failure> begin_call(Describe describe_call) {
+        if (recording_) log_.push_back(describe_call());
+        return count_call();
+    }
+
+    // Logs an event that is no call of its own (a connection closed).
+    template <class Describe>
+    void note(Describe describe_event) {
+        if (recording_) log_.push_back(describe_event());
+    }
+
+    // Turns the log on; it is off at first.
+    void record_calls() { recording_ = true; }
+    [[nodiscard]] const std::vector<std::string>& log() const { return log_; }
+    [[nodiscard]] std::size_t calls_made() const { return calls_made_; }
+
+    // Makes the n-th platform call from now (1 is the next) fail.
+    void fail_call(std::size_t n, failure how);
+
+    // Runs an action just before the n-th platform call from now.
+    void before_call(std::size_t n, std::function<void()> action);
+
+private:
+    std::optional<failure> count_call();
+
+    struct planned_failure {
+        std::size_t call;
+        failure how;
+    };
+    struct planned_action {
+        std::size_t call;
+        std::function<void()> run;
+    };
+
+    std::vector<entry_ref> entries_;
+    std::map<handle_id, entry_ref> services_;
+    std::map<handle_id, entry_ref> connections_;
+    std::map<handle_id, hid_object> hid_devices_;
+    handle_id last_handle_ = 0;
+    std::vector<std::string> log_;
+    bool recording_ = false;
+    std::size_t calls_made_ = 0;
+    std::vector<planned_failure> failures_;
+    std::vector<planned_action> actions_;
+};
+
+// The machine that the platform functions work on: the one installed, else the embedded wrist
+// device, which is made at its first use.
+machine& current_machine();
+
+// Installs a machine for as long as this object lives.
+class installed_machine {
+public:
+    explicit installed_machine(machine& device);
+    ~installed_machine();
+    installed_machine(const installed_machine&) = delete;
+    installed_machine& operator=(const installed_machine&) = delete;
+
+private:
+    machine* previous_;
+};
+
+}  // namespace platform::simulated

@@ -1,0 +1,68 @@
+#include "tests/support/capture.h"
+
+#include <array>
+#include <cstdio>
+#include <regex>
+#include <sys/mman.h>
+#include <unistd.h>
+
+namespace tests {
+
+namespace {
+
+// Sends a descriptor into memory for as long as it lives.
+class redirection {
+public:
+    explicit redirection(int descriptor)
+        : descriptor_(descriptor), saved_(::dup(descriptor)), memory_(::memfd_create("output", 0)) {
+        ::dup2(memory_, descriptor_);
+    }
+    ~redirection() {
+        ::dup2(saved_, descriptor_);
+        ::close(saved_);
+        ::close(memory_);
+    }
+    redirection(const redirection&) = delete;
+    redirection& operator=(const redirection&) = delete;
+
+    [[nodiscard]] std::string text() const {
+        std::string all;
+        std::array<char, 4096> part;
+        off_t offset = 0;
+        for (ssize_t got = 0; (got = ::pread(memory_, part.data(), part.size(), offset)) > 0;) {
+            all.append(part.data(), static_cast<std::size_t>(got));
+            offset += got;
+        }
+        return all;
+    }
+
+private:
+    int descriptor_;
+    int saved_;
+    int memory_;
+};
+
+}  // namespace
+
+outcome capture(const std::function<void()>& action) {
+    std::fflush(nullptr);
+    const redirection out(STDOUT_FILENO);
+    const redirection err(STDERR_FILENO);
+    outcome result;
+    try {
+        action();
+    } catch (const process_ended& end) {
+        result.status = end.status;
+    }
+    std::fflush(nullptr);
+    result.out = out.text();
+    result.err = without_line_numbers(err.text());
+    return result;
+}
+
+std::string without_line_numbers(const std::string& text) {
+    static const std::regex line_number(R"((\.(?:cpp|h)):\d+)");
+    return std::regex_replace(text, line_number, "$1");
+}
+
+}  // namespace tests

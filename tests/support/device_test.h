@@ -1,0 +1,48 @@
+// The vocabulary of tests that work on a virtual host of their own.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <initializer_list>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "platform/virtual/interface_driver.h"
+#include "platform/virtual/machine.h"
+#include "tests/support/capture.h"
+
+namespace tests {
+
+using platform::simulated::byte_list;
+using platform::simulated::failure;
+using platform::simulated::interface_driver;
+using platform::simulated::machine;
+
+// Registers an interface service with a name and an id; the driver that answers for it.
+interface_driver& put_service(machine& host, std::string_view name, std::int32_t id);
+
+// The line that a failed check of a subsystem writes, without the line number of the file.
+std::string failure_line(std::string_view label, std::string_view condition, std::string_view file,
+                         std::string_view code = "");
+
+// A host that is empty at first, installed for the length of the test; nothing may be left open on
+// it.
+class device_test : public ::testing::Test {
+protected:
+    void SetUp() override { host.record_calls(); }
+    void TearDown() override { EXPECT_EQ(host.open_handles(), 0U); }
+
+    // The logged events that begin with a word ("call", "open", "close").
+    [[nodiscard]] std::vector<std::string> logged(std::string_view word) const;
+
+    machine host;
+
+private:
+    platform::simulated::installed_machine installed_{host};
+};
+
+}  // namespace tests

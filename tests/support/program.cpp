@@ -1,0 +1,111 @@
+#include "tests/support/program.h"
+
+#include <array>
+#include <fcntl.h>
+#include <future>
+#include <sys/wait.h>
+#include <unistd.h>
+
+namespace tests {
+
+namespace {
+
+struct pipe_ends {
+    int read_end = -1;
+    int write_end = -1;
+};
+
+pipe_ends make_pipe(int flags = 0) {
+    std::array<int, 2> ends{};
+    if (::pipe2(ends.data(), flags | O_CLOEXEC) != 0) return {};
+    return {ends[0], ends[1]};
+}
+
+// Reads a pipe to its end; each read is one item.
+std::vector<std::string> read_pieces(int descriptor) {
+    std::vector<std::string> pieces;
+    std::array<char, 65536> part;
+    for (ssize_t got = 0; (got = ::read(descriptor, part.data(), part.size())) > 0;) {
+        pieces.emplace_back(part.data(), static_cast<std::size_t>(got));
+    }
+    ::close(descriptor);
+    return pieces;
+}
+
+std::string joined(const std::vector<std::string>& pieces) {
+    std::string all;
+    for (const std::string& piece : pieces)
+        all += piece;
+    return all;
+}
+
+pid_t start(const std::string& path, const std::vector<std::string>& arguments, int out, int err) {
+    std::vector<char*> words{const_cast<char*>(path.c_str())};
+    for (const std::string& word : arguments)
+        words.push_back(const_cast<char*>(word.c_str()));
+    words.push_back(nullptr);
+    const pid_t child = ::fork();
+    if (child != 0) return child;
+    if (out >= 0) {
+        ::dup2(out, STDOUT_FILENO);
+    } else {
+        ::close(STDOUT_FILENO);
+    }
+    ::dup2(err, STDERR_FILENO);
+    ::execv(path.c_str(), words.data());
+    ::_exit(127);
+}
+
+int wait_for(pid_t child) {
+    int status = 0;
+    ::waitpid(child, &status, 0);
+    return WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
+}
+
+// The descriptor that the program writes to, and the end to read from, if there is one.
+pipe_ends open_target(output_to target) {
+    switch (target) {
+        case output_to::pipe:
+            return make_pipe();
+        case output_to::closed_pipe: {
+            const pipe_ends ends = make_pipe();
+            ::close(ends.read_end);
+            return {-1, ends.write_end};
+        }
+        case output_to::full_device:
+            return {-1, ::open("/dev/full", O_WRONLY | O_CLOEXEC)};
+        case output_to::nowhere:
+            return {};
+    }
+    return {};
+}
+
+}  // namespace
+
+program_result run_program(const std::string& path, const std::vector<std::string>& arguments,
+                           output_to target) {
+    const pipe_ends out = open_target(target);
+    const pipe_ends err = make_pipe();
+    const pid_t child = start(path, arguments, out.write_end, err.write_end);
+    if (out.write_end >= 0) ::close(out.write_end);
+    ::close(err.write_end);
+    auto errors = std::async(std::launch::async, [&] { return joined(read_pieces(err.read_end)); });
+    std::string text;
+    if (out.read_end >= 0) text = joined(read_pieces(out.read_end));
+    const std::string error_text = errors.get();
+    return {wait_for(child), text, error_text};
+}
+
+std::vector<std::string> writes_of(const std::string& path,
+                                   const std::vector<std::string>& arguments) {
+    const pipe_ends out = make_pipe(O_DIRECT);
+    const int err = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
+    const pid_t child = start(path, arguments, out.write_end, err);
+    ::close(out.write_end);
+    ::close(err);
+    auto pieces = read_pieces(out.read_end);
+    wait_for(child);
+    return pieces;
+}
+
+}  // namespace tests
