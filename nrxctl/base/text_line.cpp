@@ -34,4 +34,11 @@ text_line& text_line::general(double value) {
     return text({digits, static_cast<std::size_t>(end.ptr - digits)});
 }
 
+text_line& text_line::fixed(double value, int digits) {
+    char text_of_value[400];  // the largest double has 309 digits before the point
+    const auto end = std::to_chars(text_of_value, text_of_value + sizeof(text_of_value), value,
+                                   std::chars_format::fixed, digits);
+    return text({text_of_value, static_cast<std::size_t>(end.ptr - text_of_value)});
+}
+
 }  // namespace nrx

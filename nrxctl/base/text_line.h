@@ -36,6 +36,9 @@ public:
     // is converted exactly.
     text_line& general(double value);
 
+    // A fraction as printf's %.<digits>f writes it.
+    text_line& fixed(double value, int digits);
+
     // Removes everything; the room is kept for the next line.
     void clear() { text_.clear(); }
 

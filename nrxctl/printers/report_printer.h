@@ -8,7 +8,7 @@
 
 namespace nrx {
 
-// Prints one report of a service on standard output. A report without bytes prints nothing.
+// Prints one report of a service on standard output. A reply without bytes is an empty view.
 using report_printer = void (*)(std::string_view service_name, std::int32_t report_id,
                                 platform::byte_view report);
 

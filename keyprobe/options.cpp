@@ -1,0 +1,44 @@
+#include "keyprobe/options.h"
+
+#include <array>
+#include <cstdlib>
+#include <getopt.h>
+
+#include "keyprobe/collection.h"
+#include "nrxctl/base/end_process.h"
+#include "nrxctl/base/output.h"
+#include "nrxctl/base/text_line.h"
+
+namespace nrx::keyprobe {
+
+namespace {
+
+constexpr char collect_all_option = 's';
+
+constexpr std::array long_options{
+    option{"collectall", no_argument, nullptr, collect_all_option},
+    option{"help", no_argument, nullptr, 'h'},
+    option{nullptr, 0, nullptr, 0},
+};
+
+[[noreturn]] void print_usage(const char* program_name) {
+    text_line line;
+    line.text("usage: ").text(program_name).text(" [--collectall]\n");
+    write_error(line.view());
+    end_process();
+}
+
+}  // namespace
+
+int run(int argc, char** argv) {
+    if (argc == 0) print_usage("keyprobe");
+    optind = 0;  // the parser starts afresh, also when this is not the first run in the process
+    while (true) {
+        const int option = getopt_long(argc, argv, "bf:", long_options.data(), nullptr);
+        if (option == -1) return EXIT_SUCCESS;
+        if (option != collect_all_option) print_usage(argv[0]);
+        collect_all();
+    }
+}
+
+}  // namespace nrx::keyprobe

@@ -1,0 +1,64 @@
+#include "nrxctl/printers/field_table.h"
+
+#include "nrxctl/base/output.h"
+#include "nrxctl/base/reply_fields.h"
+#include "nrxctl/base/text_line.h"
+
+namespace nrx {
+
+namespace {
+
+constexpr double seconds_per_scan_period = 2.56;
+
+void append_value(text_line& line, const field_row& row, const reply_fields& fields) {
+    switch (row.kind) {
+        case field_kind::heading:
+            break;
+        case field_kind::u32:
+            line.number(fields.u32(row.offset));
+            break;
+        case field_kind::s32:
+            line.number(fields.s32(row.offset));
+            break;
+        case field_kind::u64:
+            line.number(fields.u64(row.offset));
+            break;
+        case field_kind::u32_above_bit0:
+            line.number(fields.u32(row.offset) >> 1);
+            break;
+        case field_kind::u32_minus:
+            line.number(fields.u32(row.offset) - fields.u32(row.subtrahend));
+            break;
+        case field_kind::u64_minus:
+            line.number(fields.u64(row.offset) - fields.u64(row.subtrahend));
+            break;
+        case field_kind::fixed16_single:
+            line.general(static_cast<float>(fields.s32(row.offset)) /
+                         static_cast<float>(fixed_point_one));
+            break;
+        case field_kind::scan_periods:
+            line.general(fields.u32(row.offset) * seconds_per_scan_period);
+            break;
+    }
+}
+
+}  // namespace
+
+void print_fields(const field_table& table, platform::byte_view report, source_place place) {
+    check_length(report, table.length, place);
+    const reply_fields fields(report);
+    text_line line;
+    for (const field_row& row : table.rows) {
+        line.clear();
+        if (row.kind == field_kind::heading) {
+            line.text(row.label);
+        } else {
+            line.left(row.label, table.label_width).text(table.separator);
+            append_value(line, row, fields);
+            line.text(row.unit);
+        }
+        write_output(line.text("\n").view());
+    }
+}
+
+}  // namespace nrx

@@ -1,0 +1,52 @@
+#include "nrxctl/printers/sample_ranges.h"
+
+#include <algorithm>
+#include <array>
+#include <cstddef>
+
+#include "nrxctl/base/hex_dump.h"
+#include "nrxctl/base/output.h"
+#include "nrxctl/base/reply_fields.h"
+#include "nrxctl/base/text_line.h"
+
+namespace nrx {
+
+namespace {
+
+constexpr std::array<std::string_view, 3> motion_sensors{"accel", "gyro", "compass"};
+constexpr std::size_t record_size = 28;
+
+struct axis {
+    std::string_view label;
+    std::size_t lowest;  // offsets of s32 values with 16 fraction bits
+    std::size_t highest;
+};
+
+constexpr std::array axes{axis{"x: ", 4, 8}, axis{"y: ", 12, 16}, axis{"z: ", 20, 24}};
+
+void append_signed(text_line& line, double value) {
+    line.text(value < 0 ? "" : "+").fixed(value, 6);
+}
+
+void print_ranges(platform::byte_view report) {
+    check_length(report, record_size);
+    const reply_fields fields(report);
+    write_output(text_line().text("num_samples: ").number(fields.s32(0)).text("\n").view());
+    for (const axis& one : axes) {
+        text_line line;
+        append_signed(line.text(one.label), fields.s32(one.lowest) / fixed_point_one);
+        append_signed(line.text(" - "), fields.s32(one.highest) / fixed_point_one);
+        write_output(line.text("\n").view());
+    }
+}
+
+}  // namespace
+
+void print_sample_ranges(std::string_view service_name, std::int32_t /*report_id*/,
+                         platform::byte_view report) {
+    const bool is_motion_sensor = std::find(motion_sensors.begin(), motion_sensors.end(),
+                                            service_name) != motion_sensors.end();
+    is_motion_sensor ? print_ranges(report) : hex_dump(report);
+}
+
+}  // namespace nrx

@@ -1,0 +1,44 @@
+#include "nrxctl/printers/transfer_errors.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <string>
+
+#include "nrxctl/base/output.h"
+#include "nrxctl/base/reply_fields.h"
+#include "nrxctl/base/text_line.h"
+
+namespace nrx {
+
+namespace {
+
+constexpr std::size_t record_size = 32;
+constexpr std::size_t name_offset = 24;
+constexpr std::size_t longest_name = 7;
+constexpr std::size_t name_width = 15;
+
+std::string record_name(platform::byte_view record) {
+    const auto field = record.subspan(name_offset, longest_name);
+    return {field.begin(), std::find(field.begin(), field.end(), 0)};
+}
+
+void print_record(platform::byte_view record) {
+    const reply_fields fields(record);
+    text_line line;
+    line.left(record_name(record), name_width);
+    line.text(" read_errors: ").number(fields.s32(4)).text("/").number(fields.s32(0));
+    line.text(" write_errors: ").number(fields.s32(12)).text("/").number(fields.s32(8));
+    line.text(" other_errors: ").number(fields.s32(20)).text("/").number(fields.s32(16));
+    write_output(line.text("\n").view());
+}
+
+}  // namespace
+
+void print_transfer_errors(std::string_view /*service_name*/, std::int32_t /*report_id*/,
+                           platform::byte_view report) {
+    for (; report.size() >= record_size; report = report.subspan(record_size)) {
+        print_record(report.first(record_size));
+    }
+}
+
+}  // namespace nrx
