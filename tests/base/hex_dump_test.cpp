@@ -1,0 +1,62 @@
+#include "nrxctl/base/hex_dump.h"
+
+#include <numeric>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "tests/support/capture.h"
+
+namespace {
+
+std::string dumped(const std::vector<std::uint8_t>& bytes, std::string_view label = {}) {
+    return tests::capture([&] { nrx::hex_dump(bytes, label); }).out;
+}
+
+TEST(hex_dump, of_no_bytes_prints_nothing) {
+    EXPECT_EQ(dumped({}), "");
+    EXPECT_EQ(dumped({}, "payload"), "");
+}
+
+TEST(hex_dump, keeps_its_columns_on_a_short_last_line) {
+    EXPECT_EQ(dumped({0x41, 0x20, 0x80}),
+              "00000000: 41 20 80                                          | A..\n");
+    EXPECT_EQ(dumped({1, 2, 3, 4, 5, 6, 7, 0x7e}),
+              "00000000: 01 02 03 04 05 06 07 7e                           | .......~ \n");
+    EXPECT_EQ(dumped({'a', 'b', 'c', 'd', 'e', 'f', 'g', 'h', 'i'}),
+              "00000000: 61 62 63 64 65 66 67 68  69                       | abcdefgh i\n");
+}
+
+TEST(hex_dump, prints_sixteen_bytes_to_a_line_behind_the_label) {
+    std::vector<std::uint8_t> bytes(17);
+    std::iota(bytes.begin(), bytes.end(), std::uint8_t{0x1c});
+    EXPECT_EQ(dumped(bytes, "payload"),
+              "payload 00000000: 1c 1d 1e 1f 20 21 22 23  24 25 26 27 28 29 2a 2b  | .....!\"# "
+              "$%&'()*+\n"
+              "payload 00000010: 2c                                                | ,\n");
+}
+
+TEST(hex_dump, shows_only_printable_characters) {
+    std::vector<std::uint8_t> bytes(256);
+    std::iota(bytes.begin(), bytes.end(), std::uint8_t{0});
+    const std::string text = dumped(bytes);
+    std::string characters;
+    for (std::size_t line = 0; line < 16; ++line) {
+        const std::string row = text.substr(line * 80, 79);
+        EXPECT_EQ(row.substr(59, 3), " | ");
+        characters += row.substr(62, 8) + row.substr(71, 8);
+    }
+    EXPECT_EQ(text.substr(15 * 80, 10), "000000f0: ");
+    EXPECT_EQ(characters, std::string(33, '.') +
+                              "!\"#$%&'()*+,-./0123456789:;<=>?@ABCDEFGHIJKLMNOPQRSTUVWXYZ[\\]^_`"
+                              "abcdefghijklmnopqrstuvwxyz{|}~" +
+                              std::string(129, '.'));
+}
+
+TEST(hex_dump, cuts_a_label_that_leaves_no_room) {
+    const std::string text = dumped({0}, std::string(300, 'L'));
+    EXPECT_EQ(text.find_first_not_of('L'), nrx::longest_dump_label);
+    EXPECT_EQ(text.substr(nrx::longest_dump_label, 15), " 00000000: 00  ");
+}
+
+}  // namespace

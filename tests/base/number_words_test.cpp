@@ -1,0 +1,133 @@
+// Numbers and payloads as users type them.
+#include <limits>
+#include <string>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "nrxctl/base/numbers.h"
+#include "nrxctl/base/payload.h"
+#include "tests/support/capture.h"
+
+namespace {
+
+using tests::capture;
+
+TEST(parse_number, reads_decimal_and_prefixed_hexadecimal) {
+    const std::vector<std::pair<const char*, std::int64_t>> rows{
+        {"0", 0},
+        {"7", 7},
+        {"+7", 7},
+        {"-7", -7},
+        {"007", 7},
+        {"0x1f", 31},
+        {"-0x10", -16},
+        {"+0xAb", 171},
+        {"0x0", 0},
+        {"9223372036854775807", std::numeric_limits<std::int64_t>::max()},
+        {"-9223372036854775807", -std::numeric_limits<std::int64_t>::max()},
+        {"0x7fffffffffffffff", std::numeric_limits<std::int64_t>::max()},
+    };
+    for (const auto& [word, value] : rows)
+        EXPECT_EQ(nrx::parse_number(word, "bad"), value) << word;
+}
+
+TEST(parse_number, ends_the_process_with_the_message_and_the_word) {
+    for (const char* word : {"",
+                             "12a",
+                             "a",
+                             "-",
+                             "+",
+                             "--5",
+                             "+-5",
+                             "- 5",
+                             " 5",
+                             "5 ",
+                             "1.5",
+                             "0x",
+                             "-0x",
+                             "0X1f",
+                             "0x1g",
+                             "0x-1",
+                             "0x 1",
+                             "x1",
+                             "9223372036854775808",
+                             "-9223372036854775808",
+                             "0x8000000000000000",
+                             "0x10000000000000000"}) {
+        const auto refused = capture([&] { nrx::parse_number(word, "duration is invalid"); });
+        EXPECT_EQ(refused.status, 1) << word;
+        EXPECT_EQ(refused.out, "duration is invalid (" + std::string(word) + ")\n");
+        EXPECT_EQ(refused.err, "");
+    }
+}
+
+struct packed {
+    int position;
+    std::vector<std::uint8_t> payload;
+};
+
+packed pack(std::vector<std::string> words, int position = 0) {
+    std::vector<char*> pointers;
+    for (std::string& word : words)
+        pointers.push_back(word.data());
+    packed result{position, {0xee}};
+    nrx::parse_payload(pointers, result.position, result.payload);
+    return result;
+}
+
+TEST(parse_payload, packs_values_of_one_width_little_endian) {
+    struct row {
+        std::vector<std::string> words;
+        std::vector<std::uint8_t> payload;
+        int position;
+    };
+    const std::vector<row> rows{
+        {{"u16", "10", "0d10", "-x"}, {0x10, 0, 10, 0}, 3},
+        {{"1", "ff", "0xFF", "0d255"}, {1, 0xff, 0xff, 0xff}, 4},
+        {{"u8", "7"}, {7}, 2},
+        {{"u32", "12345678", "0d2147483647"}, {0x78, 0x56, 0x34, 0x12, 0xff, 0xff, 0xff, 0x7f}, 3},
+        {{"u32"}, {}, 1},
+        {{"-5", "1"}, {}, 0},
+        {{}, {}, 0},
+    };
+    for (const row& one : rows) {
+        const packed result = pack(one.words);
+        EXPECT_EQ(result.payload, one.payload) << ::testing::PrintToString(one.words);
+        EXPECT_EQ(result.position, one.position) << ::testing::PrintToString(one.words);
+    }
+}
+
+TEST(parse_payload, starts_at_the_position_and_takes_a_width_only_there) {
+    EXPECT_EQ(pack({"--command", "x", "u16", "1"}, 2).payload, (std::vector<std::uint8_t>{1, 0}));
+    EXPECT_TRUE(pack({"a"}, 1).payload.empty());
+    EXPECT_TRUE(pack({"a"}, 7).payload.empty());
+    EXPECT_EQ(capture([] { pack({"1", "u16"}); }).out, "payload value is invalid (u16)\n");
+}
+
+TEST(parse_payload, refuses_what_does_not_fit_the_width) {
+    const std::vector<std::pair<std::vector<std::string>, std::string>> rows{
+        {{"1ff"}, "Value 511 (01ff) is bigger than allowed (255, 0xff)\n"},
+        {{"100"}, "Value 256 (0100) is bigger than allowed (255, 0xff)\n"},
+        {{"u16", "1", "10000"}, "Value 65536 (010000) is bigger than allowed (65535, 0xffff)\n"},
+        {{"0d-5"}, "Value -5 (0fffffffffffffffb) is bigger than allowed (255, 0xff)\n"},
+        {{"u32", "0d-1"},
+         "Value -1 (0ffffffffffffffff) is bigger than allowed (4294967295, 0xffffffff)\n"},
+    };
+    for (const auto& [words, message] : rows) {
+        const auto refused = capture([&] { pack(words); });
+        EXPECT_EQ(refused.status, 1);
+        EXPECT_EQ(refused.out, message);
+    }
+}
+
+TEST(parse_payload, refuses_words_that_are_no_number_in_32_bits) {
+    for (const char* word : {"", "xyz", "0d", "0dff", "0d1.5", "0x", "0x-5", "1 2", "80000000",
+                             "0d2147483648", "0d-2147483649", "0d--1", "123456789012345678901"}) {
+        const auto refused = capture([&] { pack({"u32", word}); });
+        EXPECT_EQ(refused.status, 1) << word;
+        EXPECT_EQ(refused.out, "payload value is invalid (" + std::string(word) + ")\n");
+    }
+}
+
+}  // namespace

@@ -1,0 +1,62 @@
+#include "nrxctl/base/service_property.h"
+
+#include "nrxctl/base/service_discovery.h"
+#include "tests/support/device_test.h"
+
+namespace {
+
+using tests::capture;
+using tests::failure;
+using tests::failure_line;
+using tests::put_service;
+
+constexpr const char* source = "nrxctl/base/service_property.cpp";
+
+class service_property : public tests::device_test {
+protected:
+    void SetUp() override {
+        device_test::SetUp();
+        put_service(host, "accel", 31);
+        service = nrx::find_service("accel");
+    }
+    void TearDown() override {
+        service.reset();
+        device_test::TearDown();
+    }
+
+    platform::service service;
+};
+
+TEST_F(service_property, reads_back_what_was_set) {
+    const platform::property value(platform::array{1, "two", platform::dictionary{{"k", 3}}});
+    EXPECT_EQ(nrx::set_service_property(service, "ReportRates", &value), platform::success);
+    const auto result = capture(
+        [&] { EXPECT_EQ(nrx::show_service_property(service, "ReportRates"), platform::success); });
+    EXPECT_EQ(result.out, "");
+    EXPECT_EQ(result.err, "(1, \"two\", {k = 3})\n");
+}
+
+TEST_F(service_property, reports_what_is_missing) {
+    const platform::property value(1);
+    const auto result = capture([&] {
+        EXPECT_EQ(nrx::set_service_property(service, nullptr, &value), platform::bad_argument);
+        EXPECT_EQ(nrx::set_service_property(service, "x", nullptr), platform::bad_argument);
+        EXPECT_EQ(nrx::show_service_property(service, nullptr), platform::success);
+        EXPECT_EQ(nrx::show_service_property(service, "x"), platform::success);
+    });
+    EXPECT_EQ(result.err, failure_line("nrxtoollib", "propertyName", source) +
+                              failure_line("nrxtoollib", "property", source) +
+                              failure_line("nrxtoollib", "propertyName", source) +
+                              failure_line("nrxtoollib", "property", source));
+}
+
+TEST_F(service_property, reports_the_code_of_a_refused_property) {
+    const platform::property value(1);
+    host.fail_call(1, failure::unsupported);
+    const auto result = capture(
+        [&] { EXPECT_EQ(nrx::set_service_property(service, "x", &value), platform::unsupported); });
+    EXPECT_EQ(result.err,
+              failure_line("nrxtoollib", "kr == 0 ", source, "unsupported request (0xe00002c7)"));
+}
+
+}  // namespace
