@@ -1,0 +1,80 @@
+#include "nrxctl/printers/spi_status.h"
+
+#include <gtest/gtest.h>
+
+#include "tests/support/device_test.h"
+#include "tests/support/report_bytes.h"
+
+namespace {
+
+using tests::report_with;
+
+tests::outcome printed_record(const std::vector<std::uint8_t>& record) {
+    return tests::capture([&] { nrx::print_spi_status(record); });
+}
+
+std::string status_text(std::uint64_t code, std::uint64_t value) {
+    return printed_record(report_with(17, {{0, 8, 77}, {8, 1, 2}, {9, 4, code}, {13, 4, value}}))
+        .out;
+}
+
+TEST(spi_status, dumps_captured_data_under_its_heading) {
+    const std::string dump = "00000000: 61 62                                             | ab\n";
+    const std::vector<std::pair<std::uint8_t, std::string>> headings{
+        {0, "MOSI"}, {1, "MISO"}, {3, "AccelVar"}};
+    for (const auto& [type, name] : headings) {
+        auto record = report_with(9, {{0, 8, 0xffffffffffffffff}, {8, 1, type}});
+        const std::string heading = "\ntimestamp: 18446744073709551615, " + name + ": \n";
+        EXPECT_EQ(printed_record(record).out, heading);
+        record.push_back('a');
+        record.push_back('b');
+        EXPECT_EQ(printed_record(record).out, heading + dump);
+    }
+}
+
+TEST(spi_status, spells_every_error_as_the_firmware_team_knows_it) {
+    EXPECT_EQ(status_text(0x7001, 0xdeadbeef),
+              "\ntimestamp: 77, STATUS: errorCode(0x7001), errorStatus(0xdeadbeef), error: bad "
+              "checksum\n");
+    EXPECT_EQ(status_text(0x7002, 1),
+              "\ntimestamp: 77, STATUS: errorCode(0x7002), errorStatus(0x1),  error: corrupted "
+              "transport header\n");
+    EXPECT_EQ(status_text(0x7003, 0),
+              "\ntimestamp: 77, STATUS: errorCode(0x7003), errorStatus(0x0),  error:bad transport "
+              "header status\n");
+    EXPECT_EQ(status_text(0x7004, 15),
+              "\ntimestamp: 77, STATUS: errorCode(0x7004), errorStatus(0xf),  error:spi read "
+              "error\n");
+    EXPECT_EQ(status_text(0x7005, 0xffffffff),
+              "\ntimestamp: 77, STATUS: errorCode(0x7005), -1 packet_drops observed\n");
+    EXPECT_EQ(status_text(0x7009, 5), "\ntimestamp: 77, STATUS: errorCode(0x7009), \n");
+    EXPECT_EQ(status_text(0, 5), "\ntimestamp: 77, STATUS: errorCode(0x0), \n");
+}
+
+TEST(spi_status, ignores_unknown_types_and_bytes_behind_a_status) {
+    for (const std::uint64_t type : {4U, 5U, 255U}) {
+        const auto result = printed_record(report_with(30, {{8, 1, type}}));
+        EXPECT_EQ(result.out + result.err, "") << type;
+    }
+    auto record = report_with(20, {{0, 8, 1}, {8, 1, 2}, {9, 4, 0x7005}, {13, 4, 2}});
+    EXPECT_EQ(printed_record(record).out,
+              "\ntimestamp: 1, STATUS: errorCode(0x7005), 2 packet_drops observed\n");
+}
+
+TEST(spi_status, dumps_a_record_that_is_too_short_for_its_type) {
+    EXPECT_EQ(printed_record({}).out, "");
+    EXPECT_EQ(printed_record({}).err, "");
+    const auto header = printed_record({2, 0, 0, 0, 0, 0, 0, 0});
+    EXPECT_EQ(header.out,
+              "00000000: 02 00 00 00 00 00 00 00                           | ........ \n");
+    EXPECT_EQ(header.err,
+              tests::failure_line("nrxtoollib", "length >= 9", "nrxctl/printers/spi_status.cpp"));
+    for (std::size_t size = 9; size < 17; ++size) {
+        const auto status = printed_record(report_with(size, {{8, 1, 2}}));
+        EXPECT_EQ(status.out.substr(0, 10), "00000000: ") << size;
+        EXPECT_EQ(status.err, tests::failure_line("nrxtoollib", "length >= 17",
+                                                  "nrxctl/printers/spi_status.cpp"));
+    }
+}
+
+}  // namespace

@@ -1,0 +1,45 @@
+#include "tests/support/report_bytes.h"
+
+#include <algorithm>
+
+#include <gtest/gtest.h>
+
+#include "tests/support/device_test.h"
+
+namespace tests {
+
+std::vector<std::uint8_t> report_with(std::size_t size, std::initializer_list<number_at> numbers,
+                                      std::uint8_t filler) {
+    std::vector<std::uint8_t> report(size, filler);
+    for (const number_at& number : numbers) {
+        for (std::size_t i = 0; i < number.width; ++i) {
+            report.at(number.offset + i) = static_cast<std::uint8_t>(number.value >> (8 * i));
+        }
+    }
+    return report;
+}
+
+outcome printed(nrx::report_printer print, std::string_view service_name, std::int32_t report_id,
+                const std::vector<std::uint8_t>& report) {
+    return capture([&] { print(service_name, report_id, report); });
+}
+
+void print_every_prefix(nrx::report_printer print, std::string_view service_name,
+                        std::int32_t report_id, const std::vector<std::uint8_t>& report,
+                        std::size_t needed, std::string_view file) {
+    const std::string reported =
+        failure_line("nrxtoollib", "length >= " + std::to_string(needed), file);
+    const auto lines = [](const std::string& text) {
+        return std::count(text.begin(), text.end(), '\n');
+    };
+    const auto whole = lines(printed(print, service_name, report_id, report).out);
+    for (std::size_t size = 1; size <= report.size(); ++size) {
+        const std::vector<std::uint8_t> prefix(report.begin(),
+                                               report.begin() + static_cast<std::ptrdiff_t>(size));
+        const outcome result = printed(print, service_name, report_id, prefix);
+        EXPECT_EQ(result.err, size < needed ? reported : "") << size;
+        EXPECT_EQ(lines(result.out), whole) << size;
+    }
+}
+
+}  // namespace tests

@@ -1,0 +1,37 @@
+// Report bytes, put together by hand.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <initializer_list>
+#include <string_view>
+#include <vector>
+
+#include "nrxctl/printers/report_printer.h"
+#include "tests/support/capture.h"
+
+namespace tests {
+
+// One little-endian number of a report.
+struct number_at {
+    std::size_t offset;
+    std::size_t width;
+    std::uint64_t value;
+};
+
+// A report of a size with numbers in it, and filler everywhere else: what is not listed must not
+// show.
+std::vector<std::uint8_t> report_with(std::size_t size, std::initializer_list<number_at> numbers,
+                                      std::uint8_t filler = 0xa5);
+
+// What a report printer prints.
+outcome printed(nrx::report_printer print, std::string_view service_name, std::int32_t report_id,
+                const std::vector<std::uint8_t>& report);
+
+// Prints every prefix of a report from its own allocation, so that a byte read beyond the reply is
+// a sanitizer's find. Prefixes shorter than needed must be reported; empty ones must print nothing.
+void print_every_prefix(nrx::report_printer print, std::string_view service_name,
+                        std::int32_t report_id, const std::vector<std::uint8_t>& report,
+                        std::size_t needed, std::string_view file);
+
+}  // namespace tests
