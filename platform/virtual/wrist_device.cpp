@@ -1,9 +1,20 @@
 #include "platform/virtual/wrist_device.h"
 
+#include "platform/virtual/wrist/parts.h"
+
 namespace platform::simulated {
 
 std::unique_ptr<machine> make_wrist_device() {
-    return std::make_unique<machine>();
+    auto device = std::make_unique<machine>();
+    add_interface_services(*device);
+    add_hid_devices(*device);
+    add_feature_reports(*device);
+    add_button_reports(*device);
+    add_haptic_assets(*device);
+    add_diagnostic_reports(*device);
+    add_error_statistics(*device);
+    add_sample_ranges(*device);
+    return device;
 }
 
 }  // namespace platform::simulated

@@ -1,0 +1,32 @@
+// The parts that the wrist device is put together from, one file each.
+#pragma once
+
+#include "platform/virtual/machine.h"
+
+namespace platform::simulated {
+
+// The interface services with their ids. Every other part builds on these: they come first.
+void add_interface_services(machine& device);
+
+// The HID devices of the services that have one.
+void add_hid_devices(machine& device);
+
+// The feature reports of the button's HID device.
+void add_feature_reports(machine& device);
+
+// The button's statistics and diagnostic reports.
+void add_button_reports(machine& device);
+
+// The button's haptic asset table.
+void add_haptic_assets(machine& device);
+
+// The diagnostic reports of the other services.
+void add_diagnostic_reports(machine& device);
+
+// Input-report error statistics and bus transfer errors.
+void add_error_statistics(machine& device);
+
+// The sample ranges of the motion sensors.
+void add_sample_ranges(machine& device);
+
+}  // namespace platform::simulated
