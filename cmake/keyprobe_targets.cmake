@@ -33,11 +33,13 @@ function(keyprobe_library name)
   target_link_libraries(${name} PUBLIC keyprobe_flags ${ARG_LINK})
 endfunction()
 
-# keyprobe_program(NAME SOURCES ... LINK ...): a program that users start.
+# keyprobe_program(NAME SOURCES ... LINK ...): a program that users start. It is put where
+# scripts/run finds it.
 function(keyprobe_program name)
   cmake_parse_arguments(ARG "" "" "SOURCES;LINK" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
   target_link_libraries(${name} PRIVATE keyprobe_flags ${ARG_LINK})
+  set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/bin")
   if(KEYPROBE_STATIC)
     target_link_options(${name} PRIVATE -static)
   endif()
