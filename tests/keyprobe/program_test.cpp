@@ -1,0 +1,80 @@
+// keyprobe as a process, on the embedded device.
+#include "tests/support/program.h"
+
+#include <algorithm>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+using tests::output_to;
+using tests::run_program;
+
+const std::string program = KEYPROBE_PROGRAM;
+
+TEST(keyprobe_program, collects_everything_from_the_embedded_device) {
+    const auto result = run_program(program, {"--collectall"});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.err, "");
+    std::vector<std::string> banners;
+    for (std::size_t start = 0; start < result.out.size();) {
+        const std::size_t end = result.out.find('\n', start);
+        const std::string line = result.out.substr(start, end - start);
+        if (line.starts_with("=====")) banners.push_back(line);
+        start = end + 1;
+    }
+    EXPECT_EQ(banners, (std::vector<std::string>{
+                           "==========keyprobe get-stats==============",
+                           "==========keyprobe arc 0xd0==============",
+                           "==========keyprobe btmspk 0xd0==============",
+                           "==========keyprobe wqr-button 0xd0==============",
+                           "==========keyprobe wqr-button 0xd1==============",
+                           "==========keyprobe wqr-button get-assets==============",
+                           "==============hidreport get 0xe0 -u 0xFF00,0x0020===============",
+                           "==============hidreport get 0xb4 -u 0xFF00,0x0020===============",
+                           "==============hidreport get 0xe1 -u 0xFF00,0x0020===============",
+                           "==============hidreport get 0xe2 -u 0xFF00,0x0020===============",
+                           "==============hidreport get 0xe3 -u 0xFF00,0x0020===============",
+                           "==============hidreport get 0xe4 -u 0xFF00,0x0020===============",
+                       }));
+    EXPECT_NE(result.out.find("\nLength: 1479, expected 1479\nASSET [Slow][SingleDown]: enable 1"),
+              std::string::npos);
+}
+
+TEST(keyprobe_program, ends_with_the_status_of_its_words) {
+    const auto nothing = run_program(program, {});
+    EXPECT_EQ(nothing.status, 0);
+    EXPECT_EQ(nothing.out + nothing.err, "");
+    const std::string usage = "usage: " + program + " [--collectall]\n";
+    const auto help = run_program(program, {"--help"});
+    EXPECT_EQ(help.status, 1);
+    EXPECT_EQ(help.out, "");
+    EXPECT_EQ(help.err, usage);
+    const auto unknown = run_program(program, {"-s"});
+    EXPECT_EQ(unknown.status, 1);
+    EXPECT_EQ(unknown.err, program + ": invalid option -- 's'\n" + usage);
+    const auto late = run_program(program, {"--collectall", "-b"});
+    EXPECT_EQ(late.status, 1);
+    EXPECT_EQ(late.out, run_program(program, {"--collectall"}).out);
+    EXPECT_EQ(late.err, usage);
+}
+
+TEST(keyprobe_program, survives_output_that_cannot_be_written) {
+    for (const output_to target :
+         {output_to::closed_pipe, output_to::full_device, output_to::nowhere}) {
+        const auto result = run_program(program, {"--collectall"}, target);
+        EXPECT_EQ(result.status, 0);
+        EXPECT_EQ(result.err, "");
+    }
+}
+
+TEST(keyprobe_program, writes_whole_lines_one_at_a_time) {
+    const auto writes = tests::writes_of(program, {"--collectall"});
+    EXPECT_GT(writes.size(), 100U);
+    for (const std::string& text : writes) {
+        EXPECT_EQ(std::count(text.begin(), text.end(), '\n'), 1) << text;
+        EXPECT_TRUE(text.ends_with('\n')) << text;
+    }
+}
+
+}  // namespace
