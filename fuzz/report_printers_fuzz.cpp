@@ -1,0 +1,48 @@
+// Report printers given any bytes. The first byte of the input chooses how the report is printed,
+// the second the report identifier; then the service name up to a line feed, then the report.
+#include <algorithm>
+#include <array>
+#include <cstdint>
+#include <string_view>
+#include <vector>
+
+#include "fuzz/support/harness.h"
+#include "nrxctl/printers/button_stats.h"
+#include "nrxctl/printers/haptic_assets.h"
+#include "nrxctl/printers/report_printers.h"
+#include "nrxctl/printers/spi_status.h"
+#include "nrxctl/printers/value_printers.h"
+
+namespace {
+
+// As a front end prints it: through the registry, as a dump if there is no printer.
+void print_registered(std::string_view service_name, std::int32_t report_id,
+                      platform::byte_view report) {
+    const auto print = nrx::find_report_printer(report_id);
+    (print == nullptr ? nrx::print_hex : print)(service_name, report_id, report);
+}
+
+void print_record(std::string_view /*service_name*/, std::int32_t /*report_id*/,
+                  platform::byte_view report) {
+    nrx::print_spi_status(report);
+}
+
+constexpr std::array<nrx::report_printer, 9> printers{
+    print_registered, nrx::print_button_stats, nrx::print_haptic_assets,
+    print_record,     nrx::print_hex,          nrx::print_text,
+    nrx::print_raw,   nrx::print_u32,          nrx::print_text_or_dump,
+};
+
+}  // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    if (size < 2) return 0;
+    const auto print = printers[data[0] % printers.size()];
+    const auto text = fuzz::as_text(data + 2, size - 2);
+    const auto service_name = text.substr(0, text.find('\n'));
+    const std::size_t begin = std::min(size, 2 + service_name.size() + 1);
+    // In an allocation of its own, so that a byte read beyond it is found.
+    const std::vector<std::uint8_t> report(data + begin, data + size);
+    print(service_name, data[1], report);
+    return 0;
+}
