@@ -7,11 +7,7 @@
 
 #include "keyprobe/checks.h"
 #include "keyprobe/hid_feature_reports.h"
-#include "nrxctl/base/command_channel.h"
-#include "nrxctl/base/output.h"
-#include "nrxctl/printers/button_stats.h"
-#include "nrxctl/printers/haptic_assets.h"
-#include "nrxctl/printers/report_printers.h"
+#include "nrxctl/nrxtoollib.h"
 
 namespace nrx::keyprobe {
 

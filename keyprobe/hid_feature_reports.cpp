@@ -6,9 +6,7 @@
 #include <string_view>
 
 #include "keyprobe/checks.h"
-#include "nrxctl/base/hex_dump.h"
-#include "nrxctl/base/matching.h"
-#include "nrxctl/base/output.h"
+#include "nrxctl/nrxtoollib.h"
 #include "platform/hid_device.h"
 #include "platform/registry.h"
 

@@ -1,5 +1,5 @@
 #include "keyprobe/options.h"
-#include "nrxctl/base/output.h"
+#include "nrxctl/nrxtoollib.h"
 
 int main(int argc, char** argv) {
     nrx::survive_closed_pipes();

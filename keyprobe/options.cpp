@@ -5,9 +5,7 @@
 #include <getopt.h>
 
 #include "keyprobe/collection.h"
-#include "nrxctl/base/end_process.h"
-#include "nrxctl/base/output.h"
-#include "nrxctl/base/text_line.h"
+#include "nrxctl/nrxtoollib.h"
 
 namespace nrx::keyprobe {
 

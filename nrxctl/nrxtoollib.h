@@ -1,0 +1,23 @@
+// The tool library as a front end sees it: everything that it may call, and nothing else.
+#pragma once
+
+// Services and their command channel
+#include "nrxctl/base/command_channel.h"
+#include "nrxctl/base/matching.h"
+#include "nrxctl/base/profile_records.h"
+#include "nrxctl/base/service_discovery.h"
+#include "nrxctl/base/service_property.h"
+
+// Reports as text
+#include "nrxctl/base/hex_dump.h"
+#include "nrxctl/printers/button_stats.h"
+#include "nrxctl/printers/haptic_assets.h"
+#include "nrxctl/printers/report_printers.h"
+
+// Words in, lines out
+#include "nrxctl/base/end_process.h"
+#include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/numbers.h"
+#include "nrxctl/base/output.h"
+#include "nrxctl/base/payload.h"
+#include "nrxctl/base/text_line.h"
