@@ -48,6 +48,10 @@ return_code entry_name(const service& entry, std::string& name);
 // A copy of an entry's property; none if there is no such property or the entry is gone.
 std::optional<property> read_property(const service& entry, std::string_view name);
 
+// The same, into value, for those who read a property over and over: the room that value has is
+// used again. False, and value untouched, if there is none.
+bool read_property(const service& entry, std::string_view name, property& value);
+
 // Sets an entry's property. Fails with not_found if the entry is gone and with unsupported if its
 // driver takes no properties.
 return_code set_property(const service& entry, std::string_view name, const property& value);

@@ -1,6 +1,7 @@
 // One entry of the virtual host's driver registry.
 #pragma once
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
@@ -15,6 +16,7 @@ struct entry {
     std::string name;                                   // registry name
     std::vector<std::string> classes = {};              // its class, then the bases of that class
     dictionary properties = {};                         // ids, locations, usages
+    std::function<void(dictionary&)> refresh = {};      // brings them up to date for a reader
     std::shared_ptr<driver> unit = nullptr;             // null: nothing to open here
     std::shared_ptr<hid_unit> hid = nullptr;            // null: no HID device
     std::vector<std::shared_ptr<entry>> children = {};  // in the service plane

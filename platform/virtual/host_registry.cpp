@@ -22,6 +22,13 @@ std::string name_of(const entry_ref& entry) {
     return entry ? entry->name : "nothing";
 }
 
+// The entries that a look-up has to consider, in registration order.
+const std::vector<entry_ref>& possible_matches(const machine& host, const dictionary& matching) {
+    const property* name = matching.find(provider_class_key);
+    if (name == nullptr || name->text() == nullptr) return host.entries();
+    return host.entries_of_class(*name->text());
+}
+
 }  // namespace
 
 void service_kind::release(handle_id id) {
@@ -35,10 +42,11 @@ dictionary matching_class(std::string_view class_name) {
 service first_match(const dictionary& matching) {
     machine& host = current_machine();
     if (host.begin_call([&] { return "first match " + describe(matching); })) return {};
+    const auto& candidates = possible_matches(host, matching);
     const auto found = std::find_if(
-        host.entries().begin(), host.entries().end(),
+        candidates.begin(), candidates.end(),
         [&](const entry_ref& candidate) { return simulated::matches(*candidate, matching); });
-    return found == host.entries().end() ? service() : service(host.lend_service(*found));
+    return found == candidates.end() ? service() : service(host.lend_service(*found));
 }
 
 service first_child(const service& parent, std::string_view plane) {
@@ -63,15 +71,23 @@ return_code entry_name(const service& entry, std::string& name) {
     return success;
 }
 
-std::optional<property> read_property(const service& entry, std::string_view name) {
+bool read_property(const service& entry, std::string_view name, property& value) {
     machine& host = current_machine();
     const entry_ref owner = host.service(entry.id());
     if (host.begin_call(
             [&] { return "property of " + name_of(owner) + " " + std::string(name); })) {
-        return std::nullopt;
+        return false;
     }
-    const property* value = owner && owner->present ? owner->properties.find(name) : nullptr;
-    return value == nullptr ? std::nullopt : std::optional(*value);
+    if (!owner || !owner->present) return false;
+    if (owner->refresh) owner->refresh(owner->properties);
+    const property* own = owner->properties.find(name);
+    if (own != nullptr) value = *own;
+    return own != nullptr;
+}
+
+std::optional<property> read_property(const service& entry, std::string_view name) {
+    property value(0);
+    return read_property(entry, name, value) ? std::optional(std::move(value)) : std::nullopt;
 }
 
 return_code set_property(const service& entry, std::string_view name, const property& value) {

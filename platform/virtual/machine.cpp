@@ -11,6 +11,8 @@ entry_ref machine::add(entry described, const entry_ref& parent) {
     auto added = std::make_shared<entry>(std::move(described));
     if (parent) parent->children.push_back(added);
     entries_.push_back(added);
+    for (const std::string& name : added->classes)
+        by_class_[name].push_back(added);
     return added;
 }
 
@@ -25,47 +27,49 @@ void machine::remove(std::string_view name) {
     if (const entry_ref gone = find(name)) gone->present = false;
 }
 
-handle_id machine::lend_service(entry_ref provider) {
-    services_.emplace(++last_handle_, std::move(provider));
+const std::vector<entry_ref>& machine::entries_of_class(std::string_view name) const {
+    static const std::vector<entry_ref> none;
+    const auto found = by_class_.find(name);
+    return found == by_class_.end() ? none : found->second;
+}
+
+// A stream of look-ups can use up all numbers; 0 stays none.
+handle_id machine::next_handle() {
+    if (++last_handle_ == 0) ++last_handle_;
     return last_handle_;
+}
+
+handle_id machine::lend_service(entry_ref provider) {
+    return services_.lend(next_handle(), std::move(provider));
 }
 
 handle_id machine::lend_connection(entry_ref provider) {
-    connections_.emplace(++last_handle_, std::move(provider));
-    return last_handle_;
+    return connections_.lend(next_handle(), std::move(provider));
 }
 
 handle_id machine::lend_hid_device(entry_ref provider) {
-    hid_devices_.emplace(++last_handle_, hid_object{std::move(provider)});
-    return last_handle_;
+    return hid_devices_.lend(next_handle(), hid_object{std::move(provider)});
 }
 
 entry_ref machine::service(handle_id id) const {
-    const auto found = services_.find(id);
-    return found == services_.end() ? nullptr : found->second;
+    const entry_ref* found = services_.find(id);
+    return found == nullptr ? nullptr : *found;
 }
 
 entry_ref machine::connection(handle_id id) const {
-    const auto found = connections_.find(id);
-    return found == connections_.end() ? nullptr : found->second;
-}
-
-hid_object* machine::hid_device(handle_id id) {
-    const auto found = hid_devices_.find(id);
-    return found == hid_devices_.end() ? nullptr : &found->second;
+    const entry_ref* found = connections_.find(id);
+    return found == nullptr ? nullptr : *found;
 }
 
 void machine::take_back(handle_id id) {
-    services_.erase(id);
-    connections_.erase(id);
-    hid_devices_.erase(id);
+    services_.take_back(id);
+    connections_.take_back(id);
+    hid_devices_.take_back(id);
 }
 
 std::size_t machine::open_handles() const {
-    const auto opened = std::count_if(hid_devices_.begin(), hid_devices_.end(),
-                                      [](const auto& one) { return one.second.is_open; });
-    return services_.size() + connections_.size() + hid_devices_.size() +
-           static_cast<std::size_t>(opened);
+    const auto opened = hid_devices_.count_if([](const hid_object& one) { return one.is_open; });
+    return services_.size() + connections_.size() + hid_devices_.size() + opened;
 }
 
 void machine::fail_call(std::size_t n, failure how) {

@@ -9,9 +9,11 @@
 #include <string_view>
 #include <vector>
 
+#include "platform/clock.h"
 #include "platform/handle.h"
 #include "platform/virtual/entry.h"
 #include "platform/virtual/failure.h"
+#include "platform/virtual/handle_table.h"
 
 namespace platform::simulated {
 
@@ -25,7 +27,8 @@ struct hid_object {
 
 class machine {
 public:
-    // Registers an entry, as a child of parent if one is given, and returns it.
+    // Registers an entry, as a child of parent if one is given, and returns it. Its classes do not
+    // change any more.
     entry_ref add(entry described, const entry_ref& parent = nullptr);
 
     // The first present entry with a registry name; null if there is none.
@@ -38,6 +41,13 @@ public:
     // All entries in registration order, those that are gone included.
     [[nodiscard]] const std::vector<entry_ref>& entries() const { return entries_; }
 
+    // Those of a class, or of a class derived from it.
+    [[nodiscard]] const std::vector<entry_ref>& entries_of_class(std::string_view name) const;
+
+    // When the host was started; none, at first, if it does not tell.
+    void set_boot_time(calendar_instant booted) { boot_time_ = booted; }
+    [[nodiscard]] std::optional<calendar_instant> boot_time() const { return boot_time_; }
+
     // --- what is lent out ---
 
     handle_id lend_service(entry_ref provider);
@@ -48,7 +58,7 @@ public:
     // is no such handle.
     [[nodiscard]] entry_ref service(handle_id id) const;
     [[nodiscard]] entry_ref connection(handle_id id) const;
-    [[nodiscard]] hid_object* hid_device(handle_id id);
+    [[nodiscard]] hid_object* hid_device(handle_id id) { return hid_devices_.find(id); }
 
     // Takes a handle back, of whichever kind.
     void take_back(handle_id id);
@@ -85,6 +95,7 @@ public:
 
 private:
     std::optional<failure> count_call();
+    handle_id next_handle();
 
     struct planned_failure {
         std::size_t call;
@@ -96,9 +107,11 @@ private:
     };
 
     std::vector<entry_ref> entries_;
-    std::map<handle_id, entry_ref> services_;
-    std::map<handle_id, entry_ref> connections_;
-    std::map<handle_id, hid_object> hid_devices_;
+    std::map<std::string, std::vector<entry_ref>, std::less<>> by_class_;
+    std::optional<calendar_instant> boot_time_;
+    handle_table<entry_ref> services_;
+    handle_table<entry_ref> connections_;
+    handle_table<hid_object> hid_devices_;
     handle_id last_handle_ = 0;
     std::vector<std::string> log_;
     bool recording_ = false;

@@ -14,6 +14,7 @@ std::unique_ptr<machine> make_wrist_device() {
     add_diagnostic_reports(*device);
     add_error_statistics(*device);
     add_sample_ranges(*device);
+    add_clocks(*device);
     return device;
 }
 

@@ -29,4 +29,7 @@ void add_error_statistics(machine& device);
 // The sample ranges of the motion sensors.
 void add_sample_ranges(machine& device);
 
+// The boot time, and the time-sync service.
+void add_clocks(machine& device);
+
 }  // namespace platform::simulated
