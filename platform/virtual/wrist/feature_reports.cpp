@@ -22,7 +22,7 @@ constexpr auto mode = make_report<8>({
     {1, 1, 1, "detector on"},
     {2, 1, 1, "haptics on"},
     {3, 1, 1, "speed: medium"},
-    {4, 4, 8'000, "scan interval, microseconds"},
+    {4, 4, 3'600, "scan interval, microseconds"},
 });
 
 constexpr auto thresholds = make_report<17>({
