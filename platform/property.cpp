@@ -11,7 +11,11 @@ dictionary& dictionary::operator=(const dictionary& other) = default;
 dictionary& dictionary::operator=(dictionary&& other) noexcept = default;
 dictionary::~dictionary() = default;
 
-dictionary::dictionary(std::initializer_list<dictionary_entry> entries) : entries_(entries) {
+dictionary::dictionary(std::initializer_list<dictionary_entry> entries) {
+    entries_.reserve(entries.size());
+    for (const dictionary_entry& entry : entries) {
+        set(entry.key, entry.value);
+    }
 }
 
 void dictionary::set(std::string_view key, property value) {
@@ -52,6 +56,13 @@ bool same_entries(const dictionary& a, const dictionary& b) {
     });
 }
 
+std::string describe_text(std::string text) {
+    std::replace_if(
+        text.begin(), text.end(), [](unsigned char byte) { return byte < ' ' || byte == 0x7f; },
+        '.');
+    return '"' + text + '"';
+}
+
 std::string describe_items(const array& items) {
     std::string text = "(";
     for (const property& item : items) {
@@ -84,7 +95,7 @@ bool same_value(const property& a, const property& b) {
 
 std::string describe(const property& value) {
     if (const auto number = value.number()) return std::to_string(*number);
-    if (value.text() != nullptr) return '"' + *value.text() + '"';
+    if (value.text() != nullptr) return describe_text(*value.text());
     if (value.items() != nullptr) return describe_items(*value.items());
     return describe_entries(*value.entries());
 }

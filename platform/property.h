@@ -22,7 +22,7 @@ using array = std::vector<property>;
 class dictionary {
 public:
     dictionary();
-    dictionary(std::initializer_list<dictionary_entry> entries);
+    dictionary(std::initializer_list<dictionary_entry> entries);  // as if set one by one
     dictionary(const dictionary& other);
     dictionary(dictionary&& other) noexcept;
     dictionary& operator=(const dictionary& other);
@@ -73,8 +73,8 @@ struct dictionary_entry {
 // dictionaries key by key in any order.
 bool same_value(const property& a, const property& b);
 
-// The value as text on one line: numbers in decimal, texts in double quotes, arrays as (a, b),
-// dictionaries as {key = value; key = value}.
+// The value as text on one line: numbers in decimal, texts in double quotes and with full stops for
+// control characters, arrays as (a, b), dictionaries as {key = value; key = value}.
 std::string describe(const property& value);
 
 }  // namespace platform
