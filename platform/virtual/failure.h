@@ -14,7 +14,8 @@ enum class failure {
     unsupported,
     not_found,
     no_memory,
-    nothing,  // the call reports success, and hands back no connection, no bytes, an empty name
+    nothing,  // the call reports success, and hands back no connection, no scalars, no bytes, an
+              // empty name
 };
 
 inline constexpr std::array all_failures{failure::io, failure::unsupported, failure::not_found,

@@ -75,7 +75,7 @@ return_code call(const connection& connected, std::uint32_t selector, const call
     const auto how =
         host.begin_call([&] { return describe_call(provider, selector, inputs, outputs); });
     if (how) {
-        if (*how == failure::nothing) outputs.structure = {};
+        if (*how == failure::nothing) outputs = {};
         return code_of(*how);
     }
     if (!provider || !provider->present) return not_found;

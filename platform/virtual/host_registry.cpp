@@ -99,6 +99,7 @@ return_code set_property(const service& entry, std::string_view name, const prop
     });
     if (how) return code_of(*how);
     if (!owner || !owner->present) return not_found;
+    if (!owner->unit && !owner->hid) return unsupported;
     owner->properties.set(name, value);
     return success;
 }

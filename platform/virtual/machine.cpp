@@ -23,8 +23,19 @@ entry_ref machine::find(std::string_view name) const {
     return found == entries_.end() ? nullptr : *found;
 }
 
+namespace {
+
+void take_away(entry& gone) {
+    gone.present = false;
+    for (const entry_ref& child : gone.children) {
+        take_away(*child);
+    }
+}
+
+}  // namespace
+
 void machine::remove(std::string_view name) {
-    if (const entry_ref gone = find(name)) gone->present = false;
+    if (const entry_ref gone = find(name)) take_away(*gone);
 }
 
 const std::vector<entry_ref>& machine::entries_of_class(std::string_view name) const {
@@ -64,12 +75,16 @@ entry_ref machine::connection(handle_id id) const {
 void machine::take_back(handle_id id) {
     services_.take_back(id);
     connections_.take_back(id);
-    hid_devices_.take_back(id);
+    if (const hid_object* released = hid_devices_.find(id)) {
+        if (released->is_open) ++hid_devices_left_open_;
+        hid_devices_.take_back(id);
+    }
 }
 
 std::size_t machine::open_handles() const {
     const auto opened = hid_devices_.count_if([](const hid_object& one) { return one.is_open; });
-    return services_.size() + connections_.size() + hid_devices_.size() + opened;
+    return services_.size() + connections_.size() + hid_devices_.size() + hid_devices_left_open_ +
+           opened;
 }
 
 void machine::fail_call(std::size_t n, failure how) {
@@ -81,14 +96,15 @@ void machine::before_call(std::size_t n, std::function<void()> action) {
 }
 
 std::optional<failure> machine::count_call() {
-    ++calls_made_;
-    for (const planned_action& planned : actions_) {
-        if (planned.call == calls_made_) planned.run();
+    const std::size_t call = ++calls_made_;
+    const auto planned_actions = actions_;  // a copy, because an action may plan another
+    for (const planned_action& planned : planned_actions) {
+        if (planned.call == call) planned.run();
     }
-    for (const planned_failure& planned : failures_) {
-        if (planned.call == calls_made_) return planned.how;
-    }
-    return std::nullopt;
+    const auto planned =
+        std::find_if(failures_.begin(), failures_.end(),
+                     [&](const planned_failure& failing) { return failing.call == call; });
+    return planned == failures_.end() ? std::nullopt : std::optional(planned->how);
 }
 
 namespace {

@@ -34,8 +34,8 @@ public:
     // The first present entry with a registry name; null if there is none.
     [[nodiscard]] entry_ref find(std::string_view name) const;
 
-    // Takes a service away, as when its driver goes down: look-ups no longer see it, and what is
-    // open on it fails with not_found.
+    // Takes a service away with all that is attached to it, as when its driver goes down: look-ups
+    // no longer see it, and what is open on it fails with not_found.
     void remove(std::string_view name);
 
     // All entries in registration order, those that are gone included.
@@ -63,7 +63,8 @@ public:
     // Takes a handle back, of whichever kind.
     void take_back(handle_id id);
 
-    // How many handles of all kinds are out, and HID devices still open.
+    // How many handles of all kinds are out, and HID devices still open, those included whose
+    // object was released before it was closed.
     [[nodiscard]] std::size_t open_handles() const;
 
     // --- what was asked ---
@@ -90,7 +91,7 @@ public:
     // Makes the n-th platform call from now (1 is the next) fail.
     void fail_call(std::size_t n, failure how);
 
-    // Runs an action just before the n-th platform call from now.
+    // Runs an action just before the n-th platform call from now; it may plan further ones.
     void before_call(std::size_t n, std::function<void()> action);
 
 private:
@@ -112,6 +113,7 @@ private:
     handle_table<entry_ref> services_;
     handle_table<entry_ref> connections_;
     handle_table<hid_object> hid_devices_;
+    std::size_t hid_devices_left_open_ = 0;
     handle_id last_handle_ = 0;
     std::vector<std::string> log_;
     bool recording_ = false;
