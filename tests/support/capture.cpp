@@ -14,7 +14,7 @@ namespace {
 class redirection {
 public:
     explicit redirection(int descriptor)
-        : descriptor_(descriptor), saved_(::dup(descriptor)), memory_(::memfd_create("output", 0)) {
+        : descriptor_(descriptor), saved_(::dup(descriptor)), memory_(::memfd_create("output", MFD_CLOEXEC)) {
         ::dup2(memory_, descriptor_);
     }
     ~redirection() {

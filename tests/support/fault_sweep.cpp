@@ -4,8 +4,29 @@
 
 namespace tests {
 
+using platform::simulated::failure;
 using platform::simulated::installed_machine;
 using platform::simulated::machine;
+
+namespace {
+
+const char* name_of(failure how) {
+    switch (how) {
+        case failure::io:
+            return "io";
+        case failure::unsupported:
+            return "unsupported";
+        case failure::not_found:
+            return "not_found";
+        case failure::no_memory:
+            return "no_memory";
+        case failure::nothing:
+            return "nothing";
+    }
+    return "?";
+}
+
+}  // namespace
 
 void sweep_faults(const std::function<std::unique_ptr<machine>()>& make_host,
                   const std::function<void()>& operation,
@@ -15,6 +36,7 @@ void sweep_faults(const std::function<std::unique_ptr<machine>()>& make_host,
         const installed_machine installed(*good_host);
         capture(operation);
     }
+    EXPECT_EQ(good_host->open_handles(), 0U) << "in the good run";
     const std::size_t calls = good_host->calls_made();
     ASSERT_GT(calls, 0U);
     for (std::size_t call = 1; call <= calls; ++call) {
@@ -23,10 +45,13 @@ void sweep_faults(const std::function<std::unique_ptr<machine>()>& make_host,
             const installed_machine installed(*host);
             host->record_calls();
             host->fail_call(call, how);
+            std::string where;
+            host->before_call(call, [&] {
+                where = "call " + std::to_string(call) + " (" + host->log().back() + "), failure " +
+                        name_of(how);
+            });
             const fault one{call, how, capture(operation)};
-            const std::string where = "call " + std::to_string(call) + " (" +
-                                      host->log().at(call - 1) + "), failure " +
-                                      std::to_string(static_cast<int>(how));
+            EXPECT_FALSE(where.empty()) << "call " << call << " was not made a second time";
             EXPECT_TRUE(acceptable(one)) << where << "\n" << one.result.out << one.result.err;
             EXPECT_EQ(host->open_handles(), 0U) << where;
         }
