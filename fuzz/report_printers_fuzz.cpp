@@ -15,22 +15,15 @@
 
 namespace {
 
-// As a front end prints it: through the registry, as a dump if there is no printer.
-void print_registered(std::string_view service_name, std::int32_t report_id,
-                      platform::byte_view report) {
-    const auto print = nrx::find_report_printer(report_id);
-    (print == nullptr ? nrx::print_hex : print)(service_name, report_id, report);
-}
-
 void print_record(std::string_view /*service_name*/, std::int32_t /*report_id*/,
                   platform::byte_view report) {
     nrx::print_spi_status(report);
 }
 
 constexpr std::array<nrx::report_printer, 9> printers{
-    print_registered, nrx::print_button_stats, nrx::print_haptic_assets,
-    print_record,     nrx::print_hex,          nrx::print_text,
-    nrx::print_raw,   nrx::print_u32,          nrx::print_text_or_dump,
+    nrx::print_report, nrx::print_button_stats, nrx::print_haptic_assets,
+    print_record,      nrx::print_hex,          nrx::print_text,
+    nrx::print_raw,    nrx::print_u32,          nrx::print_text_or_dump,
 };
 
 }  // namespace

@@ -1,7 +1,6 @@
 #include "keyprobe/collection.h"
 
 #include <array>
-#include <cstddef>
 #include <cstdint>
 #include <string_view>
 
@@ -53,7 +52,7 @@ void dump_diagnostic_reports() {
         platform::byte_span report = buffer;
         const auto kr = read_report(row.service_name, row.report_id, report);
         if (!check_success(kr, "kr == 0 ")) return;
-        find_report_printer(row.report_id)(row.service_name, row.report_id, report);
+        print_report(row.service_name, row.report_id, report);
     }
 }
 

@@ -30,6 +30,7 @@ constexpr std::array long_options{
 
 int run(int argc, char** argv) {
     if (argc == 0) print_usage("keyprobe");
+    ::unsetenv("POSIXLY_CORRECT");  // would end the parsing at the first word that is no option
     optind = 0;  // the parser starts afresh, also when this is not the first run in the process
     while (true) {
         const int option = getopt_long(argc, argv, "bf:", long_options.data(), nullptr);

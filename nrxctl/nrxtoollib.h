@@ -1,10 +1,12 @@
-// The tool library as a front end sees it: everything that it may call, and nothing else.
+// The tool library as a front end sees it: everything that it may call, and nothing else. Besides
+// the entry points these are the words that front ends speak in: numbers, lines, checks.
 #pragma once
 
 // Services and their command channel
 #include "nrxctl/base/command_channel.h"
 #include "nrxctl/base/matching.h"
 #include "nrxctl/base/profile_records.h"
+#include "nrxctl/base/service_conn.h"
 #include "nrxctl/base/service_discovery.h"
 #include "nrxctl/base/service_property.h"
 
@@ -13,6 +15,8 @@
 #include "nrxctl/printers/button_stats.h"
 #include "nrxctl/printers/haptic_assets.h"
 #include "nrxctl/printers/report_printers.h"
+#include "nrxctl/printers/spi_status.h"
+#include "nrxctl/printers/value_printers.h"
 
 // Words in, lines out
 #include "nrxctl/base/end_process.h"

@@ -1,8 +1,6 @@
 // The records that the coprocessor's profiler keeps in its own log.
 #pragma once
 
-#include <cstddef>
-
 #include "nrxctl/base/profile_record.h"
 #include "platform/bytes.h"
 

@@ -16,22 +16,29 @@ class reply_fields {
 public:
     explicit reply_fields(platform::byte_view bytes) : bytes_(bytes) {}
 
-    [[nodiscard]] std::uint8_t u8(std::size_t offset) const { return read<std::uint8_t>(offset); }
+    [[nodiscard]] std::uint8_t u8(std::size_t offset) const { return number<std::uint8_t>(offset); }
     [[nodiscard]] std::uint32_t u32(std::size_t offset) const {
-        return read<std::uint32_t>(offset);
+        return number<std::uint32_t>(offset);
     }
-    [[nodiscard]] std::int32_t s32(std::size_t offset) const { return read<std::int32_t>(offset); }
+    [[nodiscard]] std::int32_t s32(std::size_t offset) const {
+        return number<std::int32_t>(offset);
+    }
     [[nodiscard]] std::uint64_t u64(std::size_t offset) const {
-        return read<std::uint64_t>(offset);
+        return number<std::uint64_t>(offset);
+    }
+
+    template <class Number>
+    [[nodiscard]] Number number(std::size_t offset) const {
+        return holds<Number>(offset) ? load_le<Number>(bytes_.data() + offset) : Number{0};
+    }
+
+    // Whether a number at that offset is wholly inside the bytes.
+    template <class Number>
+    [[nodiscard]] bool holds(std::size_t offset) const {
+        return offset <= bytes_.size() && bytes_.size() - offset >= sizeof(Number);
     }
 
 private:
-    template <class Number>
-    [[nodiscard]] Number read(std::size_t offset) const {
-        const bool inside = offset <= bytes_.size() && bytes_.size() - offset >= sizeof(Number);
-        return inside ? load_le<Number>(bytes_.data() + offset) : Number{0};
-    }
-
     platform::byte_view bytes_;
 };
 
@@ -39,8 +46,5 @@ private:
 // the condition of the failure report is "length >= <needed>".
 bool check_length(platform::byte_view bytes, std::size_t needed,
                   source_place place = source_place::here());
-
-// Numbers with 16 fraction bits (65536 is 1.0).
-inline constexpr double fixed_point_one = 65536.0;
 
 }  // namespace nrx

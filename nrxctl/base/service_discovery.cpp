@@ -1,6 +1,5 @@
 #include "nrxctl/base/service_discovery.h"
 
-#include <algorithm>
 #include <limits>
 #include <optional>
 
@@ -40,7 +39,7 @@ std::optional<std::int32_t> service_id_of(const platform::service& service) {
     return id ? narrow_id(id->number()) : std::nullopt;
 }
 
-platform::service find_hid_device_at(std::int32_t location) {
+platform::service find_hid_device_at(const platform::property& location) {
     platform::dictionary matching = platform::matching_class(hid_device_class);
     matching.set(platform::location_id_key, location);
     return platform::first_match(matching);
@@ -54,7 +53,7 @@ platform::service find_service(std::string_view name) {
         return id ? platform::first_match(match_service_id(*id)) : platform::service();
     }
     std::string prefixed(wqr_prefix);
-    prefixed.append(name).resize(std::min(prefixed.size(), longest_prefixed_name));
+    prefixed.append(name.substr(0, longest_prefixed_name - wqr_prefix.size()));
     if (auto service = platform::first_match(match_service_name(prefixed))) return service;
     return platform::first_match(match_service_name(name));
 }
@@ -72,7 +71,7 @@ platform::service find_hid_device(std::string_view name) {
     }
     const platform::service nrx_interface = find_service(name);
     if (!check(nrx_interface, "nrx_interface")) return {};
-    const auto location = service_id_of(nrx_interface);
+    const auto location = platform::read_property(nrx_interface, service_id_key);
     return location ? find_hid_device_at(*location) : platform::service();
 }
 
@@ -90,7 +89,7 @@ bool resolve_service_id(std::string_view name, std::int32_t& id) {
 }
 
 bool service_name_for_id(std::int32_t id, std::string& name) {
-    const platform::service service = find_service(std::to_string(id));
+    const platform::service service = platform::first_match(match_service_id(id));
     if (!check(service, "service != ((io_object_t) 0)")) return false;
     std::string entry_name;
     const platform::return_code kr = platform::entry_name(service, entry_name);

@@ -1,5 +1,8 @@
 #include "nrxctl/base/text_line.h"
 
+#include <algorithm>
+#include <limits>
+
 namespace nrx {
 
 namespace {
@@ -35,10 +38,12 @@ text_line& text_line::general(double value) {
 }
 
 text_line& text_line::fixed(double value, int digits) {
-    char text_of_value[400];  // the largest double has 309 digits before the point
-    const auto end = std::to_chars(text_of_value, text_of_value + sizeof(text_of_value), value,
-                                   std::chars_format::fixed, digits);
-    return text({text_of_value, static_cast<std::size_t>(end.ptr - text_of_value)});
+    constexpr int most_digits = 20;
+    constexpr int longest = std::numeric_limits<double>::max_exponent10 + most_digits + 4;
+    char written[longest];
+    const auto end = std::to_chars(written, written + sizeof(written), value,
+                                   std::chars_format::fixed, std::min(digits, most_digits));
+    return text({written, static_cast<std::size_t>(end.ptr - written)});
 }
 
 }  // namespace nrx

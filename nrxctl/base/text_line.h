@@ -36,7 +36,7 @@ public:
     // is converted exactly.
     text_line& general(double value);
 
-    // A fraction as printf's %.<digits>f writes it.
+    // A fraction as printf's %.<digits>f writes it, with at most 20 digits behind the point.
     text_line& fixed(double value, int digits);
 
     // Removes everything; the room is kept for the next line.

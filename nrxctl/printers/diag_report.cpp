@@ -1,7 +1,9 @@
 #include "nrxctl/printers/diag_report.h"
 
+#include <algorithm>
 #include <array>
 #include <cstddef>
+#include <optional>
 
 #include "nrxctl/base/hex_dump.h"
 #include "nrxctl/base/output.h"
@@ -70,39 +72,30 @@ void print_data_log(platform::byte_view report) {
     }
 }
 
-void print_dump(platform::byte_view report) {
-    hex_dump(report);
-}
-
 // Which layout a service's reports have.
 struct service_layout {
     std::string_view service_name;
-    std::int32_t first_report;
-    std::int32_t last_report;
+    std::optional<std::int32_t> only_report;  // none: every report
     void (*print)(platform::byte_view report);
 };
 
-constexpr std::int32_t any_first = INT32_MIN;
-constexpr std::int32_t any_last = INT32_MAX;
-
 constexpr std::array layouts{
-    service_layout{"morvane", any_first, any_last, print_scan_state},
-    service_layout{"mux", 0xd0, 0xd0, print_data_log},
-    service_layout{"baseband", 0xd0, 0xd0, print_link_counters},
+    service_layout{"morvane", std::nullopt, print_scan_state},
+    service_layout{"mux", 0xd0, print_data_log},
+    service_layout{"baseband", 0xd0, print_link_counters},
 };
 
 }  // namespace
 
 void print_diag_report(std::string_view service_name, std::int32_t report_id,
                        platform::byte_view report) {
-    auto* print = print_dump;
-    for (const service_layout& layout : layouts) {
-        if (layout.service_name == service_name && report_id >= layout.first_report &&
-            report_id <= layout.last_report) {
-            print = layout.print;
-        }
-    }
-    if (!report.empty()) print(report);
+    if (report.empty()) return;
+    const auto* layout =
+        std::find_if(layouts.begin(), layouts.end(), [&](const service_layout& candidate) {
+            return candidate.service_name == service_name &&
+                   candidate.only_report.value_or(report_id) == report_id;
+        });
+    layout == layouts.end() ? hex_dump(report) : layout->print(report);
 }
 
 }  // namespace nrx

@@ -1,5 +1,6 @@
 #include "nrxctl/printers/field_table.h"
 
+#include "nrxctl/base/fixed_point.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
@@ -9,6 +10,13 @@ namespace nrx {
 namespace {
 
 constexpr double seconds_per_scan_period = 2.56;
+
+// 0 unless both fields came back: half a difference is no number that the device said.
+template <class Number>
+Number difference(const reply_fields& fields, const field_row& row) {
+    if (!fields.holds<Number>(row.offset) || !fields.holds<Number>(row.subtrahend)) return 0;
+    return fields.number<Number>(row.offset) - fields.number<Number>(row.subtrahend);
+}
 
 void append_value(text_line& line, const field_row& row, const reply_fields& fields) {
     switch (row.kind) {
@@ -27,10 +35,10 @@ void append_value(text_line& line, const field_row& row, const reply_fields& fie
             line.number(fields.u32(row.offset) >> 1);
             break;
         case field_kind::u32_minus:
-            line.number(fields.u32(row.offset) - fields.u32(row.subtrahend));
+            line.number(difference<std::uint32_t>(fields, row));
             break;
         case field_kind::u64_minus:
-            line.number(fields.u64(row.offset) - fields.u64(row.subtrahend));
+            line.number(difference<std::uint64_t>(fields, row));
             break;
         case field_kind::fixed16_single:
             line.general(static_cast<float>(fields.s32(row.offset)) /

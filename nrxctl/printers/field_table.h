@@ -39,8 +39,9 @@ struct field_table {
     std::span<const field_row> rows;
 };
 
-// Prints a report row by row, a line each. Fields outside the report read as 0, and a report
-// shorter than the record is a failed check at place, the printer's own.
+// Prints a report row by row, a line each. Fields outside the report print as 0, and so does a
+// difference of which one field is outside; a report shorter than the record is a failed check at
+// place, the printer's own.
 void print_fields(const field_table& table, platform::byte_view report,
                   source_place place = source_place::here());
 

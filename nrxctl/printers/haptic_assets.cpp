@@ -2,6 +2,7 @@
 
 #include <cstddef>
 
+#include "nrxctl/base/fixed_point.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 
+#include "nrxctl/base/hex_dump.h"
 #include "nrxctl/printers/diag_report.h"
 #include "nrxctl/printers/input_error_stats.h"
 #include "nrxctl/printers/sample_ranges.h"
@@ -12,24 +13,35 @@ namespace nrx {
 
 namespace {
 
-constexpr std::array ranges{
-    report_printer_range{0x45, 0x45, print_transfer_errors},
-    report_printer_range{0x53, 0x53, print_sample_ranges},
-    report_printer_range{0xd0, 0xe2, print_diag_report},
-    report_printer_range{0xe3, 0xe3, print_input_error_stats},
-    report_printer_range{0xe4, 0xf7, print_diag_report},
+// A range of report identifiers and their printer.
+struct printer_range {
+    std::int32_t first;
+    std::int32_t last;
+    report_printer print;
+};
+
+constexpr std::array report_printers{
+    printer_range{0x45, 0x45, print_transfer_errors},
+    printer_range{0x53, 0x53, print_sample_ranges},
+    printer_range{0xd0, 0xe2, print_diag_report},
+    printer_range{0xe3, 0xe3, print_input_error_stats},
+    printer_range{0xe4, 0xf7, print_diag_report},
 };
 
 }  // namespace
 
-constinit const std::span<const report_printer_range> report_printers(ranges);
-
 report_printer find_report_printer(std::int32_t report_id) {
-    const auto range = std::find_if(
-        report_printers.begin(), report_printers.end(), [&](const report_printer_range& candidate) {
+    const auto* range = std::find_if(
+        report_printers.begin(), report_printers.end(), [&](const printer_range& candidate) {
             return report_id >= candidate.first && report_id <= candidate.last;
         });
     return range == report_printers.end() ? nullptr : range->print;
+}
+
+void print_report(std::string_view service_name, std::int32_t report_id,
+                  platform::byte_view report) {
+    const report_printer print = find_report_printer(report_id);
+    print == nullptr ? hex_dump(report) : print(service_name, report_id, report);
 }
 
 }  // namespace nrx

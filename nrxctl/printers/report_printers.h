@@ -2,23 +2,17 @@
 #pragma once
 
 #include <cstdint>
-#include <span>
+#include <string_view>
 
 #include "nrxctl/printers/report_printer.h"
 
 namespace nrx {
 
-// A range of report identifiers and their printer.
-struct report_printer_range {
-    std::int32_t first;
-    std::int32_t last;
-    report_printer print;
-};
-
-// The registered printers, by ascending identifier.
-extern const std::span<const report_printer_range> report_printers;
-
 // The printer registered for a report identifier; null for an identifier that has none.
 report_printer find_report_printer(std::int32_t report_id);
+
+// Prints a report with the printer registered for its identifier, or as a dump if there is none.
+void print_report(std::string_view service_name, std::int32_t report_id,
+                  platform::byte_view report);
 
 }  // namespace nrx

@@ -4,6 +4,7 @@
 #include <array>
 #include <cstddef>
 
+#include "nrxctl/base/fixed_point.h"
 #include "nrxctl/base/hex_dump.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"

@@ -32,7 +32,9 @@ const std::vector<entry_ref>& possible_matches(const machine& host, const dictio
 }  // namespace
 
 void service_kind::release(handle_id id) {
-    current_machine().take_back(id);
+    machine& host = current_machine();
+    host.note([&] { return "release " + name_of(host.service(id)); });
+    host.take_back(id);
 }
 
 dictionary matching_class(std::string_view class_name) {

@@ -42,7 +42,7 @@ TEST_F(command_channel, reads_a_report_and_closes_what_it_opened) {
     EXPECT_EQ(std::vector<std::string>(host.log().begin() + 2, host.log().end()),
               (std::vector<std::string>{"open accel type 0",
                                         "call accel 2 scalars [0xd0] in [] results 0 room 16",
-                                        "close accel"}));
+                                        "close accel", "release accel"}));
 }
 
 TEST_F(command_channel, writes_a_report) {

@@ -1,7 +1,12 @@
 #include "nrxctl/base/failure_report.h"
 
+#include <functional>
+#include <string>
+#include <vector>
+
 #include <gtest/gtest.h>
 
+#include "nrxctl/base/reply_fields.h"
 #include "tests/support/capture.h"
 
 namespace {
@@ -46,14 +51,13 @@ TEST(failure_report, prints_every_code_as_its_32_bit_pattern) {
               "Assertion failed: l:  unknown return code (0x5)\n");
 }
 
-TEST(check, answers_whether_it_holds_and_names_its_own_place) {
+TEST(check, answers_whether_it_holds) {
     const auto held = capture([] {
         EXPECT_TRUE(nrx::check(true, "service"));
         EXPECT_TRUE(nrx::check_success(platform::success, "kr == 0 "));
     });
     EXPECT_EQ(held.err, "");
-    std::string expected;
-    const auto failed = capture([&] {
+    const auto failed = capture([] {
         EXPECT_FALSE(nrx::check(nullptr, "child"));
         EXPECT_FALSE(nrx::check_success(platform::no_memory, "result == 0 "));
     });
@@ -62,8 +66,18 @@ TEST(check, answers_whether_it_holds_and_names_its_own_place) {
               "tests/base/failure_report_test.cpp\n"
               "Assertion failed: nrxtoollib: Check failed: result == 0  bail "
               "tests/base/failure_report_test.cpp out of memory (0xe00002bd)\n");
-    EXPECT_LT(nrx::source_place::here().line, __LINE__ + 1);
-    EXPECT_EQ(nrx::source_place::here().line, __LINE__);
+}
+
+TEST(check, names_the_line_where_it_stands) {
+    const auto place_of = [](const std::function<void()>& failing) {
+        const std::string text = capture(failing).err_as_written;
+        const std::string file = "tests/base/failure_report_test.cpp:";
+        return std::stoi(text.substr(text.find(file) + file.size()));
+    };
+    const std::vector<std::uint8_t> short_reply(1);
+    EXPECT_EQ(place_of([] { nrx::check(false, "child"); }), __LINE__);
+    EXPECT_EQ(place_of([] { nrx::check_success(5, "kr == 0 "); }), __LINE__);
+    EXPECT_EQ(place_of([&] { nrx::check_length(short_reply, 2); }), __LINE__);
 }
 
 }  // namespace

@@ -27,9 +27,10 @@ TEST_F(service_conn, opens_the_first_child_of_a_service_of_any_class_and_gives_a
         EXPECT_TRUE(conn.connection());
         EXPECT_EQ(host.open_handles(), 3U);
     }
-    EXPECT_EQ(host.log(), (std::vector<std::string>{"first match {IONameMatch = \"NRXApp\"}",
-                                                    "first child of NRXApp", "open client type 0",
-                                                    "close client"}));
+    EXPECT_EQ(host.log(),
+              (std::vector<std::string>{"first match {IONameMatch = \"NRXApp\"}",
+                                        "first child of NRXApp", "open client type 0",
+                                        "close client", "release client", "release NRXApp"}));
 }
 
 TEST_F(service_conn, does_not_try_the_prefix) {

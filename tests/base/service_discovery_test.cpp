@@ -147,8 +147,11 @@ TEST_F(service_discovery, resolves_numbers_without_asking_and_names_by_their_ser
 TEST_F(service_discovery, names_the_service_of_an_id) {
     put_service(host, "accel", 31);
     std::string name = "untouched";
+    put_service(host, "below", -4);
     EXPECT_TRUE(nrx::service_name_for_id(31, name));
     EXPECT_EQ(name, "accel");
+    EXPECT_TRUE(nrx::service_name_for_id(-4, name));
+    EXPECT_EQ(name, "below");
 
     name = "untouched";
     const auto missing = capture([&] { EXPECT_FALSE(nrx::service_name_for_id(5, name)); });

@@ -19,7 +19,7 @@ struct button_host {
 // (two bytes) and the feature report 0xb4 (none).
 button_host put_button_services(machine& host);
 
-// What the steps of the collection print on that host, and on standard error for its short reports.
+// What the steps of the collection print on that host.
 std::string stats_text();
 std::string diagnostics_text();
 std::string assets_text();

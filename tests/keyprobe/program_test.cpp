@@ -2,6 +2,7 @@
 #include "tests/support/program.h"
 
 #include <algorithm>
+#include <cstdlib>
 
 #include <gtest/gtest.h>
 
@@ -42,21 +43,44 @@ TEST(keyprobe_program, collects_everything_from_the_embedded_device) {
 }
 
 TEST(keyprobe_program, ends_with_the_status_of_its_words) {
-    const auto nothing = run_program(program, {});
-    EXPECT_EQ(nothing.status, 0);
-    EXPECT_EQ(nothing.out + nothing.err, "");
     const std::string usage = "usage: " + program + " [--collectall]\n";
-    const auto help = run_program(program, {"--help"});
-    EXPECT_EQ(help.status, 1);
-    EXPECT_EQ(help.out, "");
-    EXPECT_EQ(help.err, usage);
-    const auto unknown = run_program(program, {"-s"});
-    EXPECT_EQ(unknown.status, 1);
-    EXPECT_EQ(unknown.err, program + ": invalid option -- 's'\n" + usage);
-    const auto late = run_program(program, {"--collectall", "-b"});
-    EXPECT_EQ(late.status, 1);
-    EXPECT_EQ(late.out, run_program(program, {"--collectall"}).out);
-    EXPECT_EQ(late.err, usage);
+    const std::string all = run_program(program, {"--collectall"}).out;
+    struct row {
+        std::vector<std::string> words;
+        int status;
+        std::string out;
+        std::string err;
+    };
+    const std::vector<row> rows{
+        {{}, 0, "", ""},
+        {{"word", "-", "--", "--help"}, 0, "", ""},
+        {{"word", "--coll"}, 0, all, ""},
+        {{"--collectall", "--collectall"}, 0, all + all, ""},
+        {{"--help"}, 1, "", usage},
+        {{"-b"}, 1, "", usage},
+        {{"-f", "file"}, 1, "", usage},
+        {{"-f"}, 1, "", program + ": option requires an argument -- 'f'\n" + usage},
+        {{"-s"}, 1, "", program + ": invalid option -- 's'\n" + usage},
+        {{"--nope"}, 1, "", program + ": unrecognized option '--nope'\n" + usage},
+        {{"--collectall=x"},
+         1,
+         "",
+         program + ": option '--collectall' doesn't allow an argument\n" + usage},
+        {{"--collectall", "-b"}, 1, all, usage},
+    };
+    for (const row& one : rows) {
+        const auto result = run_program(program, one.words);
+        EXPECT_EQ(result.status, one.status) << ::testing::PrintToString(one.words);
+        EXPECT_EQ(result.out, one.out) << ::testing::PrintToString(one.words);
+        EXPECT_EQ(result.err, one.err) << ::testing::PrintToString(one.words);
+    }
+}
+
+TEST(keyprobe_program, parses_the_same_whatever_the_environment) {
+    ::setenv("POSIXLY_CORRECT", "1", 1);
+    const auto result = run_program(program, {"word", "--collectall"});
+    ::unsetenv("POSIXLY_CORRECT");
+    EXPECT_TRUE(result.out.starts_with("==========keyprobe get-stats==============\n"));
 }
 
 TEST(keyprobe_program, survives_output_that_cannot_be_written) {

@@ -102,7 +102,7 @@ TEST_F(virtual_machine, logs_every_call_in_words) {
                "property of button rate", R"(set property of button rate = (1, "x"))",
                "open child type 3", "open child type 0",
                "call child 10 scalars [0x0 0x1000000d0] in [00 7f ff] results 1 room 8",
-               "close child"}));
+               "close child", "release child", "release button"}));
     EXPECT_EQ(host.calls_made(), 8U);
 }
 
@@ -119,7 +119,7 @@ TEST_F(virtual_machine, logs_the_calls_on_hid_devices_and_on_nothing) {
         read_d0({});
     }
     EXPECT_EQ(host.log(), (lines{R"(first match {IONameMatch = "button"})",
-                                 "create hid device button", "open hid device button",
+                                 "create hid device button", "release button", "open hid device button",
                                  "feature report of button 224 room 4", "close hid device button",
                                  "create hid device nothing", "close hid device nothing",
                                  "call nothing 2 scalars [0xd0] in [] results 0 room 8",

@@ -107,6 +107,28 @@ TEST(diag_report, of_any_other_service_is_a_dump) {
     }
 }
 
+TEST(diag_report, prints_zeros_for_what_a_short_report_does_not_hold) {
+    const std::vector<std::uint8_t> up_to_reads(scan_state.begin(), scan_state.begin() + 28);
+    EXPECT_EQ(printed(print_diag_report, "morvane", 0xd0, up_to_reads).out,
+              "scanState                      : 0\n"
+              "nextScan in                    : 0 sec\n"
+              "numLoFiReads                   : 10\n"
+              "numFramesSinceOnWrist          : 7\n"
+              "numLoFiScans_Accepted          : 0\n"
+              "numLoFiScans_Rejected          : 0\n"
+              "\n"
+              "waitNumFramesAfterSuccess      : 6\n"
+              "motionTriggerNumFrames         : 5\n"
+              "accelVarThreshold              : 0.5\n"
+              "\n");
+    const std::vector<std::uint8_t> half_a_time(link_counters.begin(), link_counters.begin() + 11);
+    const auto text = printed(print_diag_report, "baseband", 0xd0, half_a_time).out;
+    EXPECT_TRUE(
+        text.starts_with("num_resets                   : 1\n"
+                         "last_reset_ts                : 0\n"
+                         "num_packets_sent             : 0\n"));
+}
+
 TEST(diag_report, without_bytes_prints_nothing) {
     for (const char* service : {"morvane", "mux", "baseband", "arc"}) {
         const auto result = printed(print_diag_report, service, 0xd0, {});

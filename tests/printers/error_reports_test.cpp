@@ -100,6 +100,12 @@ TEST(sample_ranges, prints_the_range_of_each_axis_of_a_motion_sensor) {
     }
     tests::print_every_prefix(nrx::print_sample_ranges, "accel", 0x53, report, 28,
                               "nrxctl/printers/sample_ranges.cpp");
+    EXPECT_EQ(printed(nrx::print_sample_ranges, "gyro", 0x53, {9, 0, 0, 0, 1}).out,
+              "num_samples: 9\n"
+              "x: +0.000000 - +0.000000\n"
+              "y: +0.000000 - +0.000000\n"
+              "z: +0.000000 - +0.000000\n");
+    EXPECT_EQ(printed(nrx::print_sample_ranges, "als", 0x53, {}).out, "");
     EXPECT_EQ(printed(nrx::print_sample_ranges, "Accel", 0x53, {'A'}).out,
               "00000000: 41                                                | A\n");
 }

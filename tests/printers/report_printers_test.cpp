@@ -1,5 +1,7 @@
 #include "nrxctl/printers/report_printers.h"
 
+#include <vector>
+
 #include <gtest/gtest.h>
 
 #include "nrxctl/printers/diag_report.h"
@@ -7,6 +9,7 @@
 #include "nrxctl/printers/name_tables.h"
 #include "nrxctl/printers/sample_ranges.h"
 #include "nrxctl/printers/transfer_errors.h"
+#include "tests/support/capture.h"
 
 namespace {
 
@@ -22,6 +25,19 @@ TEST(report_printers, registers_42_identifiers) {
         if (nrx::find_report_printer(id) != nullptr) ++registered;
     }
     EXPECT_EQ(registered, 42);
+}
+
+TEST(report_printers, print_what_has_no_printer_as_a_dump) {
+    const std::string dump = "00000000: 41                                                | A\n";
+    for (const std::int32_t id : {0x44, 0xcf, 0xf8, -1}) {
+        EXPECT_EQ(tests::capture([&] {
+                      nrx::print_report("morvane", id, std::vector<std::uint8_t>{'A'});
+                  }).out,
+                  dump);
+    }
+    EXPECT_EQ(
+        tests::capture([&] { nrx::print_report("mux", 0xd0, std::vector<std::uint8_t>(12)); }).out,
+        "data: 0 timestamp:0\n");
 }
 
 TEST(name_tables, name_what_they_know_and_nothing_else) {

@@ -32,7 +32,7 @@ TEST(spi_status, dumps_captured_data_under_its_heading) {
     }
 }
 
-TEST(spi_status, spells_every_error_as_the_firmware_team_knows_it) {
+TEST(spi_status, spells_every_error_with_its_own_blanks) {
     EXPECT_EQ(status_text(0x7001, 0xdeadbeef),
               "\ntimestamp: 77, STATUS: errorCode(0x7001), errorStatus(0xdeadbeef), error: bad "
               "checksum\n");

@@ -20,7 +20,8 @@ TEST(value_printers, text_or_dump_looks_at_every_byte_but_the_last) {
     EXPECT_EQ(text_or_dump({0, 'k'}),
               "00000000: 00 6b                                             | .k\n");
     for (const int byte : {0x08, 0x0e, 0x1f, 0x7f, 0x80, 0xff}) {
-        EXPECT_EQ(text_or_dump({static_cast<std::uint8_t>(byte), 'a'}).substr(0, 10), "00000000: ") << byte;
+        EXPECT_EQ(text_or_dump({static_cast<std::uint8_t>(byte), 'a'}).substr(0, 10), "00000000: ")
+            << byte;
     }
 }
 

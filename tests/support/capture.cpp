@@ -14,7 +14,9 @@ namespace {
 class redirection {
 public:
     explicit redirection(int descriptor)
-        : descriptor_(descriptor), saved_(::dup(descriptor)), memory_(::memfd_create("output", MFD_CLOEXEC)) {
+        : descriptor_(descriptor),
+          saved_(::dup(descriptor)),
+          memory_(::memfd_create("output", MFD_CLOEXEC)) {
         ::dup2(memory_, descriptor_);
     }
     ~redirection() {
@@ -56,7 +58,8 @@ outcome capture(const std::function<void()>& action) {
     }
     std::fflush(nullptr);
     result.out = out.text();
-    result.err = without_line_numbers(err.text());
+    result.err_as_written = err.text();
+    result.err = without_line_numbers(result.err_as_written);
     return result;
 }
 

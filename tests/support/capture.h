@@ -13,9 +13,10 @@ struct process_ended {
 };
 
 struct outcome {
-    std::string out;            // standard output
-    std::string err;            // standard error; line numbers of source files are left out
-    std::optional<int> status;  // how the process would have ended, if it would have
+    std::string out;             // standard output
+    std::string err;             // standard error; line numbers of source files are left out
+    std::string err_as_written;  // standard error with them
+    std::optional<int> status;   // how the process would have ended, if it would have
 };
 
 // Runs action with standard output and standard error redirected.

@@ -3,6 +3,7 @@
 
 #include <functional>
 #include <memory>
+#include <string>
 
 #include "platform/virtual/machine.h"
 #include "tests/support/capture.h"
@@ -11,6 +12,7 @@ namespace tests {
 
 struct fault {
     std::size_t call;  // 1 is the first call of the operation
+    std::string name;  // the failed call in the words of the log
     platform::simulated::failure how;
     outcome result;
 };
@@ -24,5 +26,10 @@ void sweep_faults(
     const std::function<bool(const fault&)>& acceptable = [](const fault& one) {
         return !one.result.err.empty();
     });
+
+// What most operations owe to a failed call: a report. Not owed where the failure tells nothing new
+// (the look-up of a prefixed name finds none in a good run either) or is none (a reply without
+// bytes).
+bool is_told(const fault& one);
 
 }  // namespace tests

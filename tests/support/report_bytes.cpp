@@ -32,13 +32,17 @@ void print_every_prefix(nrx::report_printer print, std::string_view service_name
     const auto lines = [](const std::string& text) {
         return std::count(text.begin(), text.end(), '\n');
     };
-    const auto whole = lines(printed(print, service_name, report_id, report).out);
+    const std::string whole = printed(print, service_name, report_id, report).out;
+    auto longer = report;
+    longer.resize(longer.size() + 100, 0x5a);
+    EXPECT_EQ(printed(print, service_name, report_id, longer).out, whole);
+    EXPECT_EQ(printed(print, service_name, report_id, longer).err, "");
     for (std::size_t size = 1; size <= report.size(); ++size) {
         const std::vector<std::uint8_t> prefix(report.begin(),
                                                report.begin() + static_cast<std::ptrdiff_t>(size));
         const outcome result = printed(print, service_name, report_id, prefix);
         EXPECT_EQ(result.err, size < needed ? reported : "") << size;
-        EXPECT_EQ(lines(result.out), whole) << size;
+        EXPECT_EQ(lines(result.out), lines(whole)) << size;
     }
 }
 

@@ -28,8 +28,9 @@ std::vector<std::uint8_t> report_with(std::size_t size, std::initializer_list<nu
 outcome printed(nrx::report_printer print, std::string_view service_name, std::int32_t report_id,
                 const std::vector<std::uint8_t>& report);
 
-// Prints every prefix of a report from its own allocation, so that a byte read beyond the reply is
-// a sanitizer's find. Prefixes shorter than needed must be reported; empty ones must print nothing.
+// Prints every prefix of a report, but the empty one, from its own allocation, so that a byte read
+// beyond the reply is a sanitizer's find: as many lines as the whole report, and a failure report
+// if it is shorter than needed. A longer report prints like the whole one.
 void print_every_prefix(nrx::report_printer print, std::string_view service_name,
                         std::int32_t report_id, const std::vector<std::uint8_t>& report,
                         std::size_t needed, std::string_view file);
