@@ -28,7 +28,8 @@ return_code open(const hid_device& device);
 // report that it does not have, and with not_found if it is gone; report is then as it was.
 return_code feature_report(const hid_device& device, std::uint8_t report_id, byte_span& report);
 
-// Closes the device without options. Fails with bad_argument if it was not open.
+// Closes the device without options. Fails with bad_argument if it was not open, and with the
+// device's code, when it is closed all the same.
 return_code close(const hid_device& device);
 
 }  // namespace platform

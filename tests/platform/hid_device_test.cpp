@@ -90,11 +90,4 @@ TEST_F(hid_device, that_is_gone_can_still_be_closed) {
     EXPECT_EQ(close(none), platform::bad_argument);
 }
 
-TEST_F(hid_device, that_fails_to_close_is_not_left_open) {
-    open(device);
-    host.fail_call(1, failure::io);
-    EXPECT_EQ(close(device), platform::simulated::io_failure);
-    EXPECT_EQ(host.open_handles(), 1U);
-}
-
 }  // namespace

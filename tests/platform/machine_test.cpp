@@ -126,17 +126,6 @@ TEST_F(virtual_machine, logs_the_calls_on_hid_devices_and_on_nothing) {
                                  "release hid device button"}));
 }
 
-TEST(virtual_machine_alone, logs_nothing_until_it_is_told_to) {
-    machine host;
-    const installed_machine installed(host);
-    first_match(button);
-    EXPECT_TRUE(host.log().empty());
-    EXPECT_EQ(host.calls_made(), 1U);
-    host.record_calls();
-    first_match(platform::matching_class("c"));
-    EXPECT_EQ(host.log(), lines{R"(first match {IOProviderClass = "c"})"});
-}
-
 TEST_F(virtual_machine, a_call_for_an_object_fails_without_one) {
     for (const failure how : all_failures) {
         const service found = first_match(button);
@@ -182,6 +171,7 @@ TEST_F(virtual_machine, a_call_for_a_code_fails_with_the_one_that_was_named) {
         EXPECT_EQ(report.size(), how == failure::nothing ? 0U : 4U);
         host.fail_call(1, how);
         EXPECT_EQ(close(device), code_of(how));
+        EXPECT_EQ(close(device), platform::bad_argument);
     }
 }
 
