@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <string>
+#include <utility>
 
 #include "platform/hid_device.h"
 #include "platform/virtual/machine.h"
@@ -16,7 +17,8 @@ using simulated::machine;
 
 namespace {
 
-std::string name_of(const hid_object* object) {
+std::string name_of(machine& host, handle_id id) {
+    const hid_object* object = host.hid_device(id);
     return object != nullptr ? object->provider->name : "nothing";
 }
 
@@ -24,7 +26,7 @@ std::string name_of(const hid_object* object) {
 
 void hid_device_kind::release(handle_id id) {
     machine& host = current_machine();
-    host.note([&] { return "release hid device " + name_of(host.hid_device(id)); });
+    host.note([&] { return "release hid device " + name_of(host, id); });
     host.take_back(id);
 }
 
@@ -39,10 +41,10 @@ hid_device create_hid_device(const service& provider) {
 
 return_code open(const hid_device& device) {
     machine& host = current_machine();
+    const auto how =
+        host.begin_call([&] { return "open hid device " + name_of(host, device.id()); });
+    if (how) return code_of(*how);
     hid_object* object = host.hid_device(device.id());
-    if (const auto how = host.begin_call([&] { return "open hid device " + name_of(object); })) {
-        return code_of(*how);
-    }
     if (object == nullptr || !object->provider->present) return not_found;
     object->is_open = true;
     return success;
@@ -50,15 +52,15 @@ return_code open(const hid_device& device) {
 
 return_code feature_report(const hid_device& device, std::uint8_t report_id, byte_span& report) {
     machine& host = current_machine();
-    const hid_object* object = host.hid_device(device.id());
     const auto how = host.begin_call([&] {
-        return "feature report of " + name_of(object) + " " + std::to_string(report_id) + " room " +
-               std::to_string(report.size());
+        return "feature report of " + name_of(host, device.id()) + " " + std::to_string(report_id) +
+               " room " + std::to_string(report.size());
     });
     if (how) {
         if (*how == failure::nothing) report = {};
         return code_of(*how);
     }
+    const hid_object* object = host.hid_device(device.id());
     if (object == nullptr || !object->provider->present) return not_found;
     if (!object->is_open) return bad_argument;
     const auto* bytes = object->provider->hid->feature_report(report_id);
@@ -71,14 +73,12 @@ return_code feature_report(const hid_device& device, std::uint8_t report_id, byt
 
 return_code close(const hid_device& device) {
     machine& host = current_machine();
+    const auto how =
+        host.begin_call([&] { return "close hid device " + name_of(host, device.id()); });
     hid_object* object = host.hid_device(device.id());
-    if (const auto how = host.begin_call([&] { return "close hid device " + name_of(object); })) {
-        if (object != nullptr) object->is_open = false;
-        return code_of(*how);
-    }
-    if (object == nullptr || !object->is_open) return bad_argument;
-    object->is_open = false;
-    return success;
+    const bool was_open = object != nullptr && std::exchange(object->is_open, false);
+    if (how) return code_of(*how);
+    return was_open ? success : bad_argument;
 }
 
 }  // namespace platform

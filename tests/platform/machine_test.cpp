@@ -127,6 +127,7 @@ TEST_F(virtual_machine, logs_the_calls_on_hid_devices_and_on_nothing) {
 }
 
 TEST_F(virtual_machine, a_call_for_an_object_fails_without_one) {
+    host.set_boot_time({1'700'000'000, 250'000});
     for (const failure how : all_failures) {
         const service found = first_match(button);
         host.fail_call(1, how);
@@ -137,6 +138,8 @@ TEST_F(virtual_machine, a_call_for_an_object_fails_without_one) {
         EXPECT_EQ(read_property(found, "service_id"), std::nullopt);
         host.fail_call(1, how);
         EXPECT_FALSE(create_hid_device(found));
+        host.fail_call(1, how);
+        EXPECT_EQ(platform::boot_time(), std::nullopt);
     }
 }
 
@@ -198,6 +201,31 @@ TEST_F(virtual_machine, runs_an_action_just_before_the_planned_call) {
     EXPECT_EQ(read_d0(opened), platform::not_found);
     EXPECT_TRUE(first_match(button));
     EXPECT_EQ(read_d0(opened), platform::not_found);
+}
+
+TEST_F(virtual_machine, lets_an_action_borrow_what_it_likes_in_the_middle_of_a_call) {
+    const service found = first_match(button);
+    const platform::hid_device device = create_hid_device(found);
+    std::vector<platform::hid_device> others;
+    const auto borrow = [&] {
+        for (int i = 0; i < 64; ++i)
+            others.push_back(create_hid_device(found));
+    };
+    std::array<std::uint8_t, 4> room{};
+    platform::byte_span report = room;
+    host.before_call(1, borrow);
+    EXPECT_EQ(open(device), platform::success);
+    host.before_call(1, borrow);
+    EXPECT_EQ(feature_report(device, 0xe0, report), platform::success);
+    host.before_call(1, borrow);
+    EXPECT_EQ(close(device), platform::success);
+}
+
+TEST_F(virtual_machine, tells_when_it_was_started_if_it_knows) {
+    EXPECT_EQ(platform::boot_time(), std::nullopt);
+    host.set_boot_time({1'700'000'000, 250'000});
+    EXPECT_EQ(platform::boot_time()->seconds, 1'700'000'000);
+    EXPECT_EQ(platform::boot_time()->microseconds, 250'000);
 }
 
 TEST_F(virtual_machine, takes_a_service_away_with_all_that_is_attached_to_it) {
