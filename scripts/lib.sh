@@ -8,7 +8,6 @@ jobs=$(nproc)
 readonly build_packages=(g++ cmake ninja-build)
 readonly clang_packages=(clang-14 libclang-rt-14-dev "${build_packages[@]}")
 readonly test_packages=(libgtest-dev)
-readonly bench_packages=(libbenchmark-dev)
 
 # Scripts talk on standard error: standard output belongs to what they run.
 say() {
