@@ -115,7 +115,7 @@ TEST(parse_payload, refuses_what_does_not_fit_the_width) {
          "Value -1 (0ffffffffffffffff) is bigger than allowed (4294967295, 0xffffffff)\n"},
     };
     for (const auto& [words, message] : rows) {
-        const auto refused = capture([&] { pack(words); });
+        const auto refused = capture([&packed_words = words] { pack(packed_words); });
         EXPECT_EQ(refused.status, 1);
         EXPECT_EQ(refused.out, message);
     }
