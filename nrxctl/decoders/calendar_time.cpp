@@ -1,8 +1,10 @@
 #include "nrxctl/decoders/calendar_time.h"
 
-#include <algorithm>
+#include <array>
 #include <ctime>
+#include <string_view>
 
+#include "nrxctl/decoders/put_text.h"
 #include "platform/registry.h"
 
 namespace nrx {
@@ -43,45 +45,35 @@ std::optional<std::uint64_t> time_offset() {
 // the thousand in a second, and a second has one text.
 class local_second {
 public:
-    std::string_view text(std::time_t second) {
+    const short_text& text(std::time_t second) {
         if (second != second_) {
             std::tm local{};
             ::localtime_r(&second, &local);
-            size_ = std::strftime(text_.data(), text_.size(), "%b %d %T", &local);
+            std::array<char, 30> text;
+            text_ = short_text().append(
+                {text.data(), std::strftime(text.data(), text.size(), "%b %d %T", &local)});
             second_ = second;
         }
-        return {text_.data(), size_};
+        return text_;
     }
 
 private:
     std::time_t second_ = -1;  // calendar time is unsigned here: no second has this number
-    std::array<char, longest_calendar_time + 1> text_{};
-    std::size_t size_ = 0;
+    short_text text_;
 };
 
 }  // namespace
 
-calendar_text::calendar_text(std::string_view seconds, std::uint32_t microseconds) {
-    std::array<char, 7> fraction{'.'};
-    for (auto digit = fraction.rbegin(); digit + 1 != fraction.rend(); ++digit) {
-        *digit = static_cast<char>('0' + microseconds % 10);
-        microseconds /= 10;
-    }
-    char* end = std::copy(seconds.begin(), seconds.end(), text_.begin());
-    const auto room = static_cast<std::size_t>(text_.end() - end);
-    end = std::copy_n(fraction.begin(), std::min(room, fraction.size()), end);
-    size_ = static_cast<std::size_t>(end - text_.begin());
-}
-
-std::optional<calendar_text> calendar_time(std::uint64_t timestamp) {
+std::optional<short_text> calendar_time(std::uint64_t timestamp) {
     thread_local local_second last;
     const auto offset = time_offset();
     if (!offset) return std::nullopt;
     const std::uint64_t microseconds =
         (timestamp * nanoseconds_per_microsecond + *offset) / nanoseconds_per_microsecond;
     const auto second = static_cast<std::time_t>(microseconds / microseconds_per_second);
-    return calendar_text(last.text(second),
-                         static_cast<std::uint32_t>(microseconds % microseconds_per_second));
+    std::array<char, 7 + put_slack> fraction{'.'};
+    const char* end = put_digits(fraction.data() + 1, microseconds % microseconds_per_second, 6);
+    return short_text(last.text(second)).append({fraction.data(), end});
 }
 
 }  // namespace nrx

@@ -10,42 +10,47 @@ namespace nrx {
 // Events are named by component.
 class execution_decoder : public profile_decoder {
 public:
-    [[nodiscard]] id_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] id_text event_name(std::uint32_t component, std::uint32_t event) const override;
+    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
+    [[nodiscard]] short_text event_name(std::uint32_t component,
+                                        std::uint32_t event) const override;
 };
 
 class trace_decoder : public profile_decoder {
 public:
-    [[nodiscard]] id_text component_name(std::uint32_t component) const override;
+    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
 };
 
 class sensor_decoder : public profile_decoder {
 public:
-    [[nodiscard]] id_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] id_text event_name(std::uint32_t component, std::uint32_t event) const override;
+    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
+    [[nodiscard]] short_text event_name(std::uint32_t component,
+                                        std::uint32_t event) const override;
 };
 
 class orrin_decoder : public profile_decoder {
 public:
-    [[nodiscard]] id_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] id_text event_name(std::uint32_t component, std::uint32_t event) const override;
+    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
+    [[nodiscard]] short_text event_name(std::uint32_t component,
+                                        std::uint32_t event) const override;
 };
 
 class interrupt_decoder : public profile_decoder {
 public:
-    [[nodiscard]] id_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] id_text event_name(std::uint32_t component, std::uint32_t event) const override;
+    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
+    [[nodiscard]] short_text event_name(std::uint32_t component,
+                                        std::uint32_t event) const override;
 };
 
 class uart_decoder : public profile_decoder {
 public:
-    [[nodiscard]] id_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] id_text event_name(std::uint32_t component, std::uint32_t event) const override;
+    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
+    [[nodiscard]] short_text event_name(std::uint32_t component,
+                                        std::uint32_t event) const override;
 };
 
 class scm_decoder : public profile_decoder {
 public:
-    [[nodiscard]] id_text component_name(std::uint32_t component) const override;
+    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
 };
 
 }  // namespace nrx

@@ -4,13 +4,10 @@
 #pragma once
 
 #include <array>
-#include <span>
 
 #include "nrxctl/decoders/id_names.h"
 
 namespace nrx {
-
-using name_table = std::span<const id_name>;
 
 inline constexpr std::array category_names{
     id_name{0, "exec"},   id_name{1, "trace"},     id_name{2, "sensor"}, id_name{3, "orrin"},

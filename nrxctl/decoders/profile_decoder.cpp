@@ -12,60 +12,56 @@ namespace nrx {
 
 namespace {
 
-void append_name(event_text& line, const name_field& field, const id_text& name) {
-    line.key(field.key);
-    line.quoted(name.view(), field.width);
-    line.append(',');
-}
-
-void append_bytes(event_text& line, const profile_record& record) {
-    line.key(binary_data_key);
-    line.byte_list(record.bytes, 0);
-}
-
-void append_calendar_time(event_text& line, const std::optional<calendar_text>& time) {
-    if (!time) return;
-    line.append(',');
-    line.key(calendar_time_key);
-    line.quoted(time->view(), 0);
-}
-
-void append_boot_time(event_text& line, const std::optional<std::int64_t>& time) {
-    if (!time) return;
-    line.append(',');
-    line.key(boot_timestamp_key);
-    line.number(static_cast<std::uint64_t>(*time), 0);
+char* put_name(char* to, const name_field& field, const short_text& name) {
+    to = put_quoted(put(to, field.key.text), name, field.width);
+    *to++ = ',';
+    return to;
 }
 
 }  // namespace
 
 void profile_decoder::print_record(const profile_record& record, event_text& line) const {
+    const short_text category = category_name(record.category());
+    const short_text component = component_name(record.component());
+    const short_text event = event_name(record.component(), record.event());
+    const short_text type = name_for_id(type_names, record.type());
     const auto calendar = calendar_time(record.timestamp());
     const auto booted = boot_time_usec();
-    line.append("{ ");
-    append_name(line, category_field, category_name(record.category()));
-    append_name(line, component_field, component_name(record.component()));
-    append_name(line, event_field, event_name(record.component(), record.event()));
-    append_name(line, type_field, name_for_id(type_names, record.type()));
+    line.append(longest_names, [&](char* to) {
+        to = put_name(put(to, short_text("{ ")), category_field, category);
+        to = put_name(to, component_field, component);
+        to = put_name(to, event_field, event);
+        return put_name(to, type_field, type);
+    });
     append_fields(line, record, header_rows);
     decode_body(line, record);
     append_fields(line, record, id_rows);
-    append_bytes(line, record);
-    append_calendar_time(line, calendar);
-    append_boot_time(line, booted);
-    line.append('}');
+    line.append(longest_end, [&](char* to) {
+        to = put_list(put(to, binary_data_key.text), record.bytes, 0);
+        if (calendar) {
+            *to++ = ',';
+            to = put_quoted(put(to, calendar_time_key.text), *calendar, 0);
+        }
+        if (booted) {
+            *to++ = ',';
+            to = put(to, boot_timestamp_key.text);
+            to = put_number(to, static_cast<std::uint64_t>(*booted), 0);
+        }
+        *to++ = '}';
+        return to;
+    });
 }
 
-id_text profile_decoder::category_name(std::uint32_t category) const {
+short_text profile_decoder::category_name(std::uint32_t category) const {
     return name_for_id(category_names, category);
 }
 
-id_text profile_decoder::component_name(std::uint32_t component) const {
-    return id_text(component);
+short_text profile_decoder::component_name(std::uint32_t component) const {
+    return id_number(component);
 }
 
-id_text profile_decoder::event_name(std::uint32_t /*component*/, std::uint32_t event) const {
-    return id_text(event);
+short_text profile_decoder::event_name(std::uint32_t /*component*/, std::uint32_t event) const {
+    return id_number(event);
 }
 
 void profile_decoder::decode_body(event_text& line, const profile_record& record) const {

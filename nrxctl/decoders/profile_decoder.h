@@ -24,9 +24,9 @@ public:
 
     // The name of a category, of a component of the decoder's category, of an event of such a
     // component.
-    [[nodiscard]] virtual id_text category_name(std::uint32_t category) const;
-    [[nodiscard]] virtual id_text component_name(std::uint32_t component) const;
-    [[nodiscard]] virtual id_text event_name(std::uint32_t component, std::uint32_t event) const;
+    [[nodiscard]] virtual short_text category_name(std::uint32_t category) const;
+    [[nodiscard]] virtual short_text component_name(std::uint32_t component) const;
+    [[nodiscard]] virtual short_text event_name(std::uint32_t component, std::uint32_t event) const;
 
     // Appends the fields of a record's body, each with a comma behind it, as its type says.
     virtual void decode_body(event_text& line, const profile_record& record) const;

@@ -19,46 +19,49 @@ std::string_view text_at(const profile_record& record, const record_row& row) {
     return {reinterpret_cast<const char*>(first), static_cast<std::size_t>(last - first)};
 }
 
-void append_value(event_text& line, const profile_record& record, const record_row& row) {
+char* put_value(char* to, const profile_record& record, const record_row& row) {
     const std::uint8_t* source = record.bytes.data() + row.offset;
     switch (row.kind) {
         case row_kind::u8:
-            return line.number(*source, row.width);
+            return put_number(to, *source, row.width);
         case row_kind::u16:
-            return line.number(load_le<std::uint16_t>(source), row.width);
+            return put_number(to, load_le<std::uint16_t>(source), row.width);
         case row_kind::u32:
-            return line.number(load_le<std::uint32_t>(source), row.width);
+            return put_number(to, load_le<std::uint32_t>(source), row.width);
         case row_kind::u64:
-            return line.number(load_le<std::uint64_t>(source), row.width);
+            return put_number(to, load_le<std::uint64_t>(source), row.width);
         case row_kind::hex_u32:
-            return line.quoted_hex(load_le<std::uint32_t>(source), row.width);
+            return put_quoted_hex(to, load_le<std::uint32_t>(source), row.width);
         case row_kind::fraction_16:
-            return line.fraction(load_le<std::int32_t>(source) / one_with_16_fraction_bits,
-                                 row.width);
+            return put_fraction(to, load_le<std::int32_t>(source) / one_with_16_fraction_bits,
+                                row.width);
         case row_kind::fraction_12:
-            return line.fraction(load_le<std::int32_t>(source) / one_with_12_fraction_bits,
-                                 row.width);
+            return put_fraction(to, load_le<std::int32_t>(source) / one_with_12_fraction_bits,
+                                row.width);
         case row_kind::constant:
-            return line.number(row.extent, row.width);
+            return put_number(to, row.extent, row.width);
         case row_kind::text:
-            return line.quoted(text_at(record, row), row.width);
+            return put_quoted(to, text_at(record, row), row.width);
         case row_kind::byte_list:
-            return line.byte_list({source, row.extent}, row.width);
+            return put_list(to, {source, row.extent}, row.width);
         case row_kind::counted_list: {
             const auto count = load_le<std::uint16_t>(record.bytes.data() + row.count_at);
-            return line.byte_list({source, std::min<std::size_t>(count, row.extent)}, row.width);
+            return put_list(to, {source, std::min<std::size_t>(count, row.extent)}, row.width);
         }
     }
+    return to;
 }
 
 }  // namespace
 
-void append_fields(event_text& line, const profile_record& record, record_rows fields) {
-    for (const record_row& row : fields) {
-        line.key(row.key);
-        append_value(line, record, row);
-        line.append(',');
-    }
+void append_fields(event_text& line, const profile_record& record, const record_rows& fields) {
+    line.append(fields.longest, [&](char* to) {
+        for (const record_row& row : fields.all) {
+            to = put_value(put(to, row.key.text), record, row);
+            *to++ = ',';
+        }
+        return to;
+    });
 }
 
 }  // namespace nrx

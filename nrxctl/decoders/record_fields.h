@@ -8,6 +8,6 @@
 namespace nrx {
 
 // Appends each row: its key, its value, a comma.
-void append_fields(event_text& line, const profile_record& record, record_rows fields);
+void append_fields(event_text& line, const profile_record& record, const record_rows& fields);
 
 }  // namespace nrx

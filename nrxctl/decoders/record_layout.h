@@ -129,5 +129,11 @@ inline constexpr std::array wake_event_rows{
     rows::u32("wake_reason", 16),
     rows::u32("service_id", 20),
 };
+inline constexpr std::array special_bodies{
+    record_rows(talvor_data_in_rows),
+    record_rows(talvor_data_out_rows),
+    record_rows(wake_request_rows),
+    record_rows(wake_event_rows),
+};
 
 }  // namespace nrx

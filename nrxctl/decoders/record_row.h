@@ -2,12 +2,15 @@
 #pragma once
 
 #include <algorithm>
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <span>
+#include <string_view>
 
 #include "nrxctl/base/profile_record.h"
 #include "nrxctl/decoders/field_key.h"
+#include "nrxctl/decoders/put_text.h"
 
 namespace nrx {
 
@@ -36,9 +39,60 @@ struct record_row {
     std::uint8_t count_at = 0;  // where the count of a counted list stands
 };
 
-using record_rows = std::span<const record_row>;
-
 inline constexpr std::uint8_t number_width = 10;
+
+// The most digits of unsigned numbers; the longest fraction with six significant digits.
+inline constexpr std::size_t u8_digits = 3;
+inline constexpr std::size_t u16_digits = 5;
+inline constexpr std::size_t u32_digits = 10;
+inline constexpr std::size_t u32_hex_digits = 8;
+inline constexpr std::size_t u64_digits = 20;
+inline constexpr std::size_t longest_fraction = std::string_view("-1.52588e-05").size();
+inline constexpr std::size_t quotes = 2;
+
+// The most characters of a row's value, blanks in front of it aside.
+consteval std::size_t longest_value(const record_row& row) {
+    switch (row.kind) {
+        case row_kind::u8:
+        case row_kind::constant:
+            return u8_digits;
+        case row_kind::u16:
+            return u16_digits;
+        case row_kind::u32:
+            return u32_digits;
+        case row_kind::u64:
+            return u64_digits;
+        case row_kind::hex_u32:  // the width covers the opening quote alone
+            return row.width + u32_hex_digits + 1;
+        case row_kind::fraction_16:
+        case row_kind::fraction_12:
+            return longest_fraction;
+        case row_kind::text:
+            return row.extent + quotes;
+        case row_kind::byte_list:
+        case row_kind::counted_list:
+            return longest_list(row.extent);
+    }
+    throw "a kind without a bound";
+}
+
+// The most characters of a row: key, value, comma.
+consteval std::size_t longest_row(const record_row& row) {
+    return row.key.text.size() + std::max<std::size_t>(row.width, longest_value(row)) + 1;
+}
+
+// A table of rows, and the most characters that they are written in.
+struct record_rows {
+    consteval record_rows() = default;
+    template <std::size_t Count>
+    consteval record_rows(const std::array<record_row, Count>& table) : all(table) {
+        for (const record_row& row : all)
+            longest += longest_row(row);
+    }
+
+    std::span<const record_row> all;
+    std::size_t longest = 0;
+};
 
 namespace rows {
 

@@ -23,7 +23,10 @@ std::optional<std::string_view> format_profile_record(const profile_record& reco
 void print_profile_record(const profile_record& record) {
     event_text line;
     if (!format_profile_record(record, line)) return;
-    line.append('\n');
+    line.append(1, [](char* to) {
+        *to++ = '\n';
+        return to;
+    });
     write_output(line.view());
 }
 

@@ -14,11 +14,11 @@ constexpr std::uint32_t data_out = 0x04000103;
 
 }  // namespace
 
-id_text talvor_decoder::component_name(std::uint32_t component) const {
+short_text talvor_decoder::component_name(std::uint32_t component) const {
     return name_for_id(talvor_components, component);
 }
 
-id_text talvor_decoder::event_name(std::uint32_t /*component*/, std::uint32_t event) const {
+short_text talvor_decoder::event_name(std::uint32_t /*component*/, std::uint32_t event) const {
     return name_for_id(talvor_events, event);
 }
 

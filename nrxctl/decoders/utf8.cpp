@@ -4,7 +4,6 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
-#include <numeric>
 
 namespace nrx {
 
@@ -30,10 +29,10 @@ bool is_between(char character, std::uint8_t from, std::uint8_t to) {
 }
 
 bool is_ascii(std::string_view text) {
-    const auto seen = std::accumulate(
-        text.begin(), text.end(), 0U,
-        [](unsigned bits, char character) { return bits | static_cast<std::uint8_t>(character); });
-    return seen < 0x80;
+    char seen = 0;
+    for (const char character : text)
+        seen = static_cast<char>(seen | character);
+    return is_between(seen, 0, 0x7f);
 }
 
 // The size of the character that text, which is not empty, begins with; 0 if it is none.

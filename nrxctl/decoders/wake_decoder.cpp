@@ -14,11 +14,11 @@ constexpr std::uint32_t event_info = 0x0a000203;
 
 }  // namespace
 
-id_text wake_decoder::component_name(std::uint32_t component) const {
+short_text wake_decoder::component_name(std::uint32_t component) const {
     return name_for_id(wake_components, component);
 }
 
-id_text wake_decoder::event_name(std::uint32_t /*component*/, std::uint32_t event) const {
+short_text wake_decoder::event_name(std::uint32_t /*component*/, std::uint32_t event) const {
     return name_for_id(wake_events, event);
 }
 

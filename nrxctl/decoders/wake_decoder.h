@@ -10,8 +10,9 @@ namespace nrx {
 
 class wake_decoder : public profile_decoder {
 public:
-    [[nodiscard]] id_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] id_text event_name(std::uint32_t component, std::uint32_t event) const override;
+    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
+    [[nodiscard]] short_text event_name(std::uint32_t component,
+                                        std::uint32_t event) const override;
     void decode_body(event_text& line, const profile_record& record) const override;
 };
 

@@ -1,7 +1,7 @@
 // The wrist device keeps the time of the host that it runs on: the coprocessor's time is the host's
 // monotonic clock, the calendar its wall clock.
 
-#include <chrono>
+#include <ctime>
 
 #include "platform/virtual/time_sync.h"
 #include "platform/virtual/wrist/parts.h"
@@ -10,30 +10,34 @@ namespace platform::simulated {
 
 namespace {
 
-using std::chrono::duration_cast;
-
-template <class Clock>
-std::int64_t nanoseconds_of(typename Clock::time_point instant) {
-    return duration_cast<std::chrono::nanoseconds>(instant.time_since_epoch()).count();
+std::int64_t nanoseconds_of(clockid_t clock) {
+    timespec now{};
+    ::clock_gettime(clock, &now);
+    return std::int64_t{now.tv_sec} * 1000000000 + now.tv_nsec;
 }
 
-sync_point host_times() {
-    return {nanoseconds_of<std::chrono::steady_clock>(std::chrono::steady_clock::now()),
-            nanoseconds_of<std::chrono::system_clock>(std::chrono::system_clock::now())};
+// Both clocks at the host's last tick, which is the same instant for both.
+sync_point last_tick() {
+    sync_point point{};
+    do {
+        point.coprocessor = nanoseconds_of(CLOCK_MONOTONIC_COARSE);
+        point.calendar = nanoseconds_of(CLOCK_REALTIME_COARSE);
+    } while (point.coprocessor != nanoseconds_of(CLOCK_MONOTONIC_COARSE));
+    return point;
 }
 
-// The calendar at the zero of the monotonic clock, which the host's start is.
 calendar_instant boot_instant() {
-    const sync_point now = host_times();
-    const std::int64_t microseconds = (now.calendar - now.coprocessor) / 1000;
-    return {microseconds / 1000000, microseconds % 1000000};
+    constexpr std::int64_t microseconds_per_second = 1000000;
+    const std::int64_t booted =
+        (nanoseconds_of(CLOCK_REALTIME) - nanoseconds_of(CLOCK_BOOTTIME)) / 1000;
+    return {booted / microseconds_per_second, booted % microseconds_per_second};
 }
 
 }  // namespace
 
 void add_clocks(machine& device) {
     device.set_boot_time(boot_instant());
-    add_time_sync(device, host_times);
+    add_time_sync(device, last_tick);
 }
 
 }  // namespace platform::simulated
