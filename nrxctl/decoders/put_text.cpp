@@ -1,8 +1,11 @@
 #include "nrxctl/decoders/put_text.h"
 
+#include <algorithm>
 #include <array>
 #include <bit>
 #include <charconv>
+#include <cstring>
+#include <string_view>
 
 namespace nrx {
 
