@@ -42,7 +42,7 @@ std::optional<std::uint64_t> time_offset() {
 }
 
 // A second of the calendar in local time, "Nov 16 17:22:28". The last one is kept: records come by
-// the thousand in a second, and a second has one text.
+// the thousand in a second, and a second has one text while the time zone stays the same.
 class local_second {
 public:
     const short_text& text(std::time_t second) {

@@ -50,7 +50,8 @@ char* put_quoted(char* to, const Text& text, std::size_t width) {
     return to;
 }
 
-// A number of up to count digits in decimal, zeros in front of it up to count digits, at most 8.
+// A number of up to count digits in decimal, zeros in front of it up to count digits; count is 1
+// to 8.
 char* put_digits(char* to, std::uint64_t value, std::size_t count);
 
 // A number in decimal.

@@ -13,6 +13,11 @@ namespace nrx {
 
 // A name in single quotes, and how wide it is at least.
 struct name_field {
+    consteval name_field(field_key name_key, std::uint8_t name_width)
+        : key(name_key), width(name_width) {
+        if (name_width > widest_padding) throw "the field is too wide";
+    }
+
     field_key key;
     std::uint8_t width;
 };

@@ -78,6 +78,7 @@ consteval std::size_t longest_value(const record_row& row) {
 
 // The most characters of a row: key, value, comma.
 consteval std::size_t longest_row(const record_row& row) {
+    if (row.width > widest_padding) throw "the field is too wide";
     return row.key.text.size() + std::max<std::size_t>(row.width, longest_value(row)) + 1;
 }
 

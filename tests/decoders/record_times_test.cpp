@@ -142,6 +142,16 @@ TEST_F(record_times, a_platform_call_that_fails_leaves_its_field_out_and_is_not_
         });
 }
 
+TEST_F(record_times, whoever_asks_gets_a_sync_point_of_the_current_second) {
+    sync_point now{200'000'000, 5'000'000'000};
+    add_time_sync(host, [&] { return now; });
+    EXPECT_EQ(at(0), "Jan 01 00:00:04.800000");
+    now = {900'000'000, 50'000'000'000};
+    EXPECT_EQ(at(0), "Jan 01 00:00:04.800000");
+    now = {1'000'000'000, 61'000'000'000};
+    EXPECT_EQ(at(0), "Jan 01 00:01:00.000000");
+}
+
 TEST_F(record_times, the_wrist_device_keeps_the_time_of_its_host) {
     const auto device = platform::simulated::make_wrist_device();
     const platform::simulated::installed_machine installed(*device);

@@ -56,6 +56,14 @@ TEST_F(scm_packets, a_transfer_names_bus_event_direction_and_both_times) {
     late.bytes[15] = 0x80;
     EXPECT_EQ(print(late),
               "spi0.0: scm_read wqr_timestamp=-9223372036854767685 scm_timestamp=-1\n");
+    auto its_data = data(1, 0);
+    std::copy_n(late.bytes.begin() + 8, 8, its_data.bytes.begin() + 8);
+    EXPECT_EQ(print(its_data), "spi0.0:   data[24-0/100]: a5 \n");
+    for (std::size_t offset = 8; offset < 16; ++offset) {
+        auto other = its_data;
+        other.bytes[offset] ^= 0x01;
+        EXPECT_EQ(print(other), "") << offset;
+    }
 }
 
 TEST_F(scm_packets, data_belongs_to_the_last_transfer_by_its_time_stamp) {
