@@ -24,23 +24,23 @@ struct record_kind {
     std::uint8_t type;
 };
 constexpr std::array kinds{
-    record_kind{30, 0, 1, 3, 3},    // scheduler events
-    record_kind{15, 0, 2, 1, 5},    // functions
-    record_kind{6, 0, 4, 8, 2},     // commands
-    record_kind{4, 0, 5, 1, 9},     // external functions
-    record_kind{12, 1, 4, 4, 3},    // traces
-    record_kind{4, 1, 4, 4, 11},    // annotations
-    record_kind{14, 2, 7, 8, 1},    // sensor data
-    record_kind{2, 2, 7, 11, 8},    // sensor information
-    record_kind{1, 2, 7, 11, 12},   // decimation
-    record_kind{2, 3, 1, 2, 3},     // orrin
-    record_kind{6, 4, 1, 2, 3},     // talvor samples
-    record_kind{4, 5, 1, 1, 4},     // triggers
-    record_kind{3, 6, 3, 8, 1},     // uart packets
-    record_kind{1, 8, 2, 2, 3},     // control
-    record_kind{8, 9, 6, 32, 3},    // bus transfers
-    record_kind{2, 10, 1, 3, 3},    // wake-ups
-    record_kind{1, 10, 1, 2, 13},   // wake requests
+    record_kind{30, 0, 1, 3, 3},   // scheduler events
+    record_kind{15, 0, 2, 1, 5},   // functions
+    record_kind{6, 0, 4, 8, 2},    // commands
+    record_kind{4, 0, 5, 1, 9},    // external functions
+    record_kind{12, 1, 4, 4, 3},   // traces
+    record_kind{4, 1, 4, 4, 11},   // annotations
+    record_kind{14, 2, 7, 8, 1},   // sensor data
+    record_kind{2, 2, 7, 11, 8},   // sensor information
+    record_kind{1, 2, 7, 11, 12},  // decimation
+    record_kind{2, 3, 1, 2, 3},    // orrin
+    record_kind{6, 4, 1, 2, 3},    // talvor samples
+    record_kind{4, 5, 1, 1, 4},    // triggers
+    record_kind{3, 6, 3, 8, 1},    // uart packets
+    record_kind{1, 8, 2, 2, 3},    // control
+    record_kind{8, 9, 6, 32, 3},   // bus transfers
+    record_kind{2, 10, 1, 3, 3},   // wake-ups
+    record_kind{1, 10, 1, 2, 13},  // wake requests
 };
 constexpr std::array<std::string_view, 4> texts{"accel", "als_filter", "gyro_decimate", "imu"};
 

@@ -44,6 +44,7 @@ private:
 process_cost run_once(const std::vector<std::string>& words) {
     static const no_streams streams;
     std::vector<char*> arguments;
+    arguments.reserve(words.size() + 1);
     for (const std::string& word : words) {
         arguments.push_back(const_cast<char*>(word.c_str()));
     }
