@@ -1,10 +1,20 @@
 // The host's clocks.
 #pragma once
 
+#include <chrono>
 #include <cstdint>
 #include <optional>
 
 namespace platform {
+
+// Ticks of the monotonic clock.
+std::uint64_t ticks();
+
+// Seconds from one tick to the next; the same for the whole life of the process.
+double tick_period();
+
+// Sleeps. The interrupt handler runs inside, and the sleep then goes on to its end.
+void sleep(std::chrono::microseconds duration);
 
 // An instant since 1970, UTC.
 struct calendar_instant {

@@ -4,6 +4,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "platform/handle.h"
 #include "platform/property.h"
@@ -37,6 +38,11 @@ dictionary matching_class(std::string_view class_name);
 // The first service, in registration order, that matches; none if there is none. The caller owns
 // it.
 service first_match(const dictionary& matching);
+
+// Every service that matches, in registration order, into found. The caller owns them. Fails with
+// the host's code if the registry cannot be enumerated; found is then untouched. No match is a
+// success with nothing found.
+return_code all_matches(const dictionary& matching, std::vector<service>& found);
 
 // The first child of an entry in a plane; none if it has none or is gone. The caller owns it.
 service first_child(const service& parent, std::string_view plane);

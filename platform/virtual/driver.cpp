@@ -10,6 +10,14 @@ return_code driver::open(std::uint32_t type) {
     return type == 0 ? success : unsupported;
 }
 
+std::shared_ptr<shared_queue> driver::memory(std::uint32_t /*type*/) {
+    return nullptr;
+}
+
+std::shared_ptr<shared_queue> driver::notification(std::uint32_t /*type*/) {
+    return nullptr;
+}
+
 namespace {
 
 bool fits(presence wanted, std::size_t given) {

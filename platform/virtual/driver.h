@@ -2,8 +2,10 @@
 #pragma once
 
 #include <cstdint>
+#include <memory>
 
 #include "platform/connection.h"
+#include "platform/virtual/shared_queue.h"
 
 namespace platform::simulated {
 
@@ -23,6 +25,11 @@ public:
     // One method call. On success the spans of outputs are cut to what was returned.
     virtual return_code call(std::uint32_t selector, const call_inputs& inputs,
                              call_outputs& outputs) = 0;
+
+    // The queue in the memory of that type, and the one whose data are signalled as notifications
+    // of that type; null if there is none, as it is unless a driver says otherwise.
+    virtual std::shared_ptr<shared_queue> memory(std::uint32_t type);
+    virtual std::shared_ptr<shared_queue> notification(std::uint32_t type);
 };
 
 // Whether a method takes or gives a structure.

@@ -51,6 +51,19 @@ service first_match(const dictionary& matching) {
     return found == candidates.end() ? service() : service(host.lend_service(*found));
 }
 
+return_code all_matches(const dictionary& matching, std::vector<service>& found) {
+    machine& host = current_machine();
+    const auto how = host.begin_call([&] { return "all matches " + describe(matching); });
+    if (how && *how != failure::nothing) return code_of(*how);
+    found.clear();
+    if (how) return success;
+    for (const entry_ref& candidate : host.entries()) {
+        if (simulated::matches(*candidate, matching))
+            found.emplace_back(host.lend_service(candidate));
+    }
+    return success;
+}
+
 service first_child(const service& parent, std::string_view plane) {
     machine& host = current_machine();
     const entry_ref entry = host.service(parent.id());

@@ -62,6 +62,14 @@ handle_id machine::lend_hid_device(entry_ref provider) {
     return hid_devices_.lend(next_handle(), hid_object{std::move(provider)});
 }
 
+handle_id machine::lend_mapping(queue_mapping mapping) {
+    return mappings_.lend(next_handle(), std::move(mapping));
+}
+
+handle_id machine::lend_port() {
+    return ports_.lend(next_handle(), nullptr);
+}
+
 entry_ref machine::service(handle_id id) const {
     const entry_ref* found = services_.find(id);
     return found == nullptr ? nullptr : *found;
@@ -72,6 +80,17 @@ entry_ref machine::connection(handle_id id) const {
     return found == nullptr ? nullptr : *found;
 }
 
+bool machine::attach(handle_id port, std::shared_ptr<shared_queue> queue) {
+    auto* attached = ports_.find(port);
+    if (attached != nullptr) *attached = std::move(queue);
+    return attached != nullptr;
+}
+
+std::shared_ptr<shared_queue> machine::attached_queue(handle_id port) const {
+    const auto* attached = ports_.find(port);
+    return attached == nullptr ? nullptr : *attached;
+}
+
 void machine::take_back(handle_id id) {
     services_.take_back(id);
     connections_.take_back(id);
@@ -79,12 +98,14 @@ void machine::take_back(handle_id id) {
         if (released->is_open) ++hid_devices_left_open_;
         hid_devices_.take_back(id);
     }
+    mappings_.take_back(id);
+    ports_.take_back(id);
 }
 
 std::size_t machine::open_handles() const {
     const auto opened = hid_devices_.count_if([](const hid_object& one) { return one.is_open; });
     return services_.size() + connections_.size() + hid_devices_.size() + hid_devices_left_open_ +
-           opened;
+           opened + mappings_.size() + ports_.size();
 }
 
 void machine::fail_call(std::size_t n, failure how) {

@@ -14,6 +14,8 @@
 #include "platform/virtual/entry.h"
 #include "platform/virtual/failure.h"
 #include "platform/virtual/handle_table.h"
+#include "platform/virtual/interrupts.h"
+#include "platform/virtual/machine_clock.h"
 
 namespace platform::simulated {
 
@@ -23,6 +25,30 @@ using entry_ref = std::shared_ptr<entry>;
 struct hid_object {
     entry_ref provider;
     bool is_open = false;
+};
+
+// A data queue mapped by a client.
+struct queue_mapping {
+    entry_ref provider;
+    std::shared_ptr<shared_queue> queue;
+};
+
+// A platform call under way, and how it is to fail, if it is. Its end is a safe point: an interrupt
+// noted by then is served.
+class begun_call {
+public:
+    explicit begun_call(std::optional<failure> how) : how_(how) {}
+    ~begun_call() { serve_interrupt(); }
+    begun_call(const begun_call&) = delete;
+    begun_call& operator=(const begun_call&) = delete;
+    begun_call(begun_call&&) = delete;
+    begun_call& operator=(begun_call&&) = delete;
+
+    explicit operator bool() const { return how_.has_value(); }
+    failure operator*() const { return *how_; }
+
+private:
+    std::optional<failure> how_;
 };
 
 class machine {
@@ -53,12 +79,21 @@ public:
     handle_id lend_service(entry_ref provider);
     handle_id lend_connection(entry_ref provider);
     handle_id lend_hid_device(entry_ref provider);
+    handle_id lend_mapping(queue_mapping mapping);
+    handle_id lend_port();
 
-    // The entry behind a service, the provider of a connection, a HID device object; null if there
-    // is no such handle.
+    // The entry behind a service, the provider of a connection, a HID device object, a mapping;
+    // null if there is no such handle.
     [[nodiscard]] entry_ref service(handle_id id) const;
     [[nodiscard]] entry_ref connection(handle_id id) const;
     [[nodiscard]] hid_object* hid_device(handle_id id) { return hid_devices_.find(id); }
+    [[nodiscard]] const queue_mapping* mapping(handle_id id) const { return mappings_.find(id); }
+
+    // Lets a queue signal its data on a port; false if there is no such port.
+    bool attach(handle_id port, std::shared_ptr<shared_queue> queue);
+
+    // The queue that signals its data on a port; null if none does.
+    [[nodiscard]] std::shared_ptr<shared_queue> attached_queue(handle_id port) const;
 
     // Takes a handle back, of whichever kind.
     void take_back(handle_id id);
@@ -67,14 +102,16 @@ public:
     // object was released before it was closed.
     [[nodiscard]] std::size_t open_handles() const;
 
+    machine_clock& clock() { return clock_; }
+
     // --- what was asked ---
 
     // Every platform call that can fail starts here: it is counted and logged in the words that
-    // describe_call gives. Returns how the call is to fail, if it is.
+    // describe_call gives. Returns how the call is to fail, if it is, to be kept until its end.
     template <class Describe>
-    std::optional<failure> begin_call(Describe describe_call) {
+    begun_call begin_call(Describe describe_call) {
         if (recording_) log_.push_back(describe_call());
-        return count_call();
+        return begun_call(count_call());
     }
 
     // Logs an event that is no call of its own (a connection closed).
@@ -114,7 +151,10 @@ private:
     handle_table<entry_ref> connections_;
     handle_table<hid_object> hid_devices_;
     std::size_t hid_devices_left_open_ = 0;
+    handle_table<queue_mapping> mappings_;
+    handle_table<std::shared_ptr<shared_queue>> ports_;  // null: nothing attached
     handle_id last_handle_ = 0;
+    machine_clock clock_;
     std::vector<std::string> log_;
     bool recording_ = false;
     std::size_t calls_made_ = 0;

@@ -6,6 +6,7 @@ namespace platform::simulated {
 
 std::unique_ptr<machine> make_wrist_device() {
     auto device = std::make_unique<machine>();
+    device->clock().follow_host();
     add_interface_services(*device);
     add_hid_devices(*device);
     add_feature_reports(*device);

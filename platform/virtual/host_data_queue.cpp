@@ -1,0 +1,133 @@
+// Shared memory of drivers, its data queues and their ports, on the virtual host.
+
+#include <algorithm>
+#include <string>
+
+#include "platform/data_queue.h"
+#include "platform/virtual/machine.h"
+
+namespace platform {
+
+using simulated::current_machine;
+using simulated::entry_ref;
+using simulated::failure;
+using simulated::machine;
+using simulated::queue_mapping;
+using simulated::shared_queue;
+
+namespace {
+
+std::string name_of(const entry_ref& provider) {
+    return provider ? provider->name : "nothing";
+}
+
+std::string name_of(const queue_mapping* mapping) {
+    return name_of(mapping != nullptr ? mapping->provider : nullptr);
+}
+
+return_code check_mapping(const queue_mapping* mapping) {
+    if (mapping == nullptr) return bad_argument;
+    return mapping->provider->present ? success : not_found;
+}
+
+// Waits until the queue holds data, its driver is gone, or, which only the manual clock can tell,
+// nothing can ever happen any more. The mapping is kept: an interrupt handler may take back others.
+return_code wait_on(machine& host, const queue_mapping mapping) {
+    while (mapping.provider->present) {
+        simulated::serve_interrupt();
+        mapping.queue->catch_up();
+        if (!mapping.queue->empty()) return success;
+        if (!host.clock().pass(mapping.queue->next_due())) return simulated::endless_wait;
+    }
+    return not_found;
+}
+
+}  // namespace
+
+void memory_kind::release(handle_id id) {
+    machine& host = current_machine();
+    const queue_mapping* mapping = host.mapping(id);
+    host.note([&] { return "unmap " + name_of(mapping); });
+    if (mapping != nullptr) mapping->queue->unmapped();
+    host.take_back(id);
+}
+
+void port_kind::release(handle_id id) {
+    current_machine().take_back(id);
+}
+
+return_code map_memory(const connection& connected, std::uint32_t type, mapped_memory& mapped) {
+    machine& host = current_machine();
+    const entry_ref provider = host.connection(connected.id());
+    const auto how = host.begin_call(
+        [&] { return "map " + name_of(provider) + " memory " + std::to_string(type); });
+    if (how) return code_of(*how);
+    if (!provider || !provider->present) return not_found;
+    auto queue = provider->unit->memory(type);
+    if (!queue) return unsupported;
+    mapped = mapped_memory(host.lend_mapping({provider, std::move(queue)}));
+    return success;
+}
+
+return_code attach_port(const connection& connected, std::uint32_t type,
+                        const notification_port& port, std::uint64_t reference) {
+    machine& host = current_machine();
+    const entry_ref provider = host.connection(connected.id());
+    const auto how = host.begin_call([&] {
+        return "attach port to " + name_of(provider) + " notification " + std::to_string(type) +
+               " reference " + std::to_string(reference);
+    });
+    if (how) return code_of(*how);
+    if (!provider || !provider->present) return not_found;
+    const auto queue = provider->unit->notification(type);
+    if (!queue) return unsupported;
+    return host.attach(port.id(), queue) ? success : bad_argument;
+}
+
+notification_port allocate_port() {
+    machine& host = current_machine();
+    const auto how = host.begin_call([] { return std::string("allocate port"); });
+    return how ? notification_port() : notification_port(host.lend_port());
+}
+
+bool data_available(const mapped_memory& queue) {
+    machine& host = current_machine();
+    const queue_mapping* mapping = host.mapping(queue.id());
+    const auto how = host.begin_call([&] { return "data available " + name_of(mapping); });
+    if (how || check_mapping(mapping) != success) return false;
+    mapping->queue->catch_up();
+    return !mapping->queue->empty();
+}
+
+return_code dequeue(const mapped_memory& queue, byte_span& entry) {
+    machine& host = current_machine();
+    const queue_mapping* mapping = host.mapping(queue.id());
+    const auto how = host.begin_call(
+        [&] { return "dequeue " + name_of(mapping) + " room " + std::to_string(entry.size()); });
+    if (how) {
+        if (*how == failure::nothing) entry = {};
+        return code_of(*how);
+    }
+    const return_code usable = check_mapping(mapping);
+    if (usable != success) return usable;
+    if (mapping->queue->empty()) return simulated::nothing_queued;
+    const shared_queue::entry& first = mapping->queue->first();
+    if (first.size() > entry.size()) return simulated::no_room;
+    std::copy(first.begin(), first.end(), entry.begin());
+    entry = entry.first(first.size());
+    mapping->queue->drop_first();
+    return success;
+}
+
+return_code wait_for_data(const mapped_memory& queue, const notification_port& port) {
+    machine& host = current_machine();
+    const queue_mapping* mapping = host.mapping(queue.id());
+    const auto how = host.begin_call([&] { return "wait " + name_of(mapping); });
+    if (how) return code_of(*how);
+    const return_code usable = check_mapping(mapping);
+    if (usable != success) return usable;
+    if (host.attached_queue(port.id()) != mapping->queue) return bad_argument;
+    return wait_on(host, *mapping);
+}
+
+}  // namespace platform

@@ -1,0 +1,151 @@
+// What a backend promises about clocks and interrupts.
+
+#include "platform/interrupt.h"
+
+#include <csignal>
+#include <ctime>
+#include <thread>
+
+#include "platform/clock.h"
+#include "tests/platform/queue_host.h"
+
+namespace tests {
+
+using namespace std::chrono_literals;
+using platform::simulated::shared_queue;
+
+namespace {
+
+int handled = 0;
+std::function<void()> on_handle;
+
+void count_interrupt() {
+    ++handled;
+    if (on_handle) on_handle();
+}
+
+bool has_default_action() {
+    struct sigaction current {};
+    ::sigaction(SIGINT, nullptr, &current);
+    return current.sa_handler == SIG_DFL;
+}
+
+}  // namespace
+
+class interrupt : public queue_test {
+protected:
+    void SetUp() override {
+        queue_test::SetUp();
+        handled = 0;
+        on_handle = nullptr;
+        platform::handle_interrupt(count_interrupt);
+    }
+    void TearDown() override {
+        platform::restore_default_interrupt();
+        EXPECT_TRUE(has_default_action());
+        queue_test::TearDown();
+    }
+};
+
+TEST_F(interrupt, is_handled_when_a_platform_call_returns_and_not_before) {
+    std::raise(SIGINT);
+    EXPECT_EQ(handled, 0);
+    EXPECT_FALSE(platform::first_match({{"IONameMatch", "nobody"}}));
+    EXPECT_EQ(handled, 1);
+    EXPECT_FALSE(platform::first_match({{"IONameMatch", "nobody"}}));
+    EXPECT_EQ(handled, 1);
+}
+
+TEST_F(interrupt, comes_once_however_often_it_came_in_before_it_was_handled) {
+    std::raise(SIGINT);
+    std::raise(SIGINT);
+    EXPECT_FALSE(platform::first_match({}));
+    EXPECT_EQ(handled, 1);
+}
+
+TEST_F(interrupt, inside_its_own_handler_is_handled_after_that) {
+    on_handle = [] {
+        if (handled > 1) return;
+        std::raise(SIGINT);
+        EXPECT_FALSE(platform::first_match({}));
+        EXPECT_EQ(handled, 1);
+    };
+    std::raise(SIGINT);
+    EXPECT_FALSE(platform::first_match({}));
+    EXPECT_EQ(handled, 2);
+}
+
+TEST_F(interrupt, noted_before_the_default_action_is_back_is_still_handled) {
+    std::raise(SIGINT);
+    platform::restore_default_interrupt();
+    EXPECT_EQ(handled, 1);
+    EXPECT_TRUE(has_default_action());
+}
+
+TEST_F(interrupt, is_handled_inside_a_wait_that_its_handler_can_end) {
+    const auto shared = std::make_shared<shared_queue>();
+    stream(shared);
+    on_handle = [&] { shared->add({1}); };
+    host.clock().plan(40ms, [] { std::raise(SIGINT); });
+    EXPECT_EQ(platform::wait_for_data(queue, port), platform::success);
+    EXPECT_EQ(handled, 1);
+    EXPECT_EQ(host.clock().now(), 40ms);
+}
+
+TEST_F(interrupt, before_a_wait_is_not_missed_by_it) {
+    const auto shared = std::make_shared<shared_queue>();
+    stream(shared);
+    host.clock().follow_host();
+    on_handle = [&] { shared->add({1}); };
+    host.before_call(1, [] { std::raise(SIGINT); });
+    EXPECT_EQ(platform::wait_for_data(queue, port), platform::success);
+    EXPECT_EQ(handled, 1);
+}
+
+TEST_F(interrupt, inside_a_sleep_is_handled_at_once_and_the_sleep_goes_on) {
+    on_handle = [&] { EXPECT_EQ(host.clock().now(), 30ms); };
+    host.clock().plan(30ms, [] { std::raise(SIGINT); });
+    platform::sleep(100ms);
+    EXPECT_EQ(handled, 1);
+    EXPECT_EQ(host.clock().now(), 100ms);
+}
+
+// Another thread sends it while this one is blocked, and wakes it without help of the clock.
+TEST_F(interrupt, wakes_a_blocked_wait_which_uses_no_processor_time) {
+    const auto shared = std::make_shared<shared_queue>();
+    stream(shared);
+    host.clock().follow_host();
+    on_handle = [&] { shared->add({1}); };
+    std::thread sender([self = ::pthread_self()] {
+        std::this_thread::sleep_for(100ms);
+        ::pthread_kill(self, SIGINT);
+    });
+    const std::clock_t before = std::clock();
+    EXPECT_EQ(platform::wait_for_data(queue, port), platform::success);
+    EXPECT_LT(std::clock() - before, CLOCKS_PER_SEC / 20);
+    sender.join();
+    EXPECT_EQ(handled, 1);
+}
+
+using host_clock = device_test;
+
+TEST_F(host_clock, counts_ticks_of_the_period_that_it_tells) {
+    const auto before = platform::ticks();
+    platform::sleep(250ms);
+    const auto elapsed = static_cast<double>(platform::ticks() - before) * platform::tick_period();
+    EXPECT_DOUBLE_EQ(elapsed, 0.25);
+    EXPECT_GT(platform::ticks() - before, 250'000U);
+}
+
+TEST_F(host_clock, sleeps_as_long_as_asked_when_it_follows_the_host) {
+    host.clock().follow_host();
+    const auto before = std::chrono::steady_clock::now();
+    const auto ticks_before = platform::ticks();
+    platform::sleep(20ms);
+    const auto slept = std::chrono::steady_clock::now() - before;
+    EXPECT_GE(slept, 20ms);
+    EXPECT_GE(static_cast<double>(platform::ticks() - ticks_before) * platform::tick_period(),
+              0.0199);
+}
+
+}  // namespace tests
