@@ -1,10 +1,9 @@
 // The clocks of the virtual host.
 
-#include "platform/clock.h"
-
 #include <ratio>
 #include <string>
 
+#include "platform/clock.h"
 #include "platform/virtual/machine.h"
 
 namespace platform {

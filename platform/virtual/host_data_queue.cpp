@@ -21,7 +21,8 @@ std::string name_of(const entry_ref& provider) {
     return provider ? provider->name : "nothing";
 }
 
-std::string name_of(const queue_mapping* mapping) {
+std::string name_of(machine& host, handle_id id) {
+    const queue_mapping* mapping = host.mapping(id);
     return name_of(mapping != nullptr ? mapping->provider : nullptr);
 }
 
@@ -46,9 +47,8 @@ return_code wait_on(machine& host, const queue_mapping mapping) {
 
 void memory_kind::release(handle_id id) {
     machine& host = current_machine();
-    const queue_mapping* mapping = host.mapping(id);
-    host.note([&] { return "unmap " + name_of(mapping); });
-    if (mapping != nullptr) mapping->queue->unmapped();
+    host.note([&] { return "unmap " + name_of(host, id); });
+    if (const queue_mapping* mapping = host.mapping(id)) mapping->queue->unmapped();
     host.take_back(id);
 }
 
@@ -92,8 +92,8 @@ notification_port allocate_port() {
 
 bool data_available(const mapped_memory& queue) {
     machine& host = current_machine();
+    const auto how = host.begin_call([&] { return "data available " + name_of(host, queue.id()); });
     const queue_mapping* mapping = host.mapping(queue.id());
-    const auto how = host.begin_call([&] { return "data available " + name_of(mapping); });
     if (how || check_mapping(mapping) != success) return false;
     mapping->queue->catch_up();
     return !mapping->queue->empty();
@@ -108,6 +108,7 @@ return_code dequeue(const mapped_memory& queue, byte_span& entry) {
         if (*how == failure::nothing) entry = {};
         return code_of(*how);
     }
+    const queue_mapping* mapping = host.mapping(queue.id());
     const return_code usable = check_mapping(mapping);
     if (usable != success) return usable;
     if (mapping->queue->empty()) return simulated::nothing_queued;
@@ -121,9 +122,9 @@ return_code dequeue(const mapped_memory& queue, byte_span& entry) {
 
 return_code wait_for_data(const mapped_memory& queue, const notification_port& port) {
     machine& host = current_machine();
-    const queue_mapping* mapping = host.mapping(queue.id());
-    const auto how = host.begin_call([&] { return "wait " + name_of(mapping); });
+    const auto how = host.begin_call([&] { return "wait " + name_of(host, queue.id()); });
     if (how) return code_of(*how);
+    const queue_mapping* mapping = host.mapping(queue.id());
     const return_code usable = check_mapping(mapping);
     if (usable != success) return usable;
     if (host.attached_queue(port.id()) != mapping->queue) return bad_argument;

@@ -54,12 +54,22 @@ return_code interface_driver::call(std::uint32_t selector, const call_inputs& in
 return_code interface_driver::write_report(const call_inputs& inputs, call_outputs& /*outputs*/) {
     const auto id = narrow_scalar(inputs.scalars[0]);
     if (!id || report(*id) == nullptr) return unsupported;
+    const auto sink = report_sinks_.find(*id);
+    const return_code taken =
+        sink == report_sinks_.end() ? success : sink->second(inputs.structure);
+    if (taken != success) return taken;
     reports_[*id].assign(inputs.structure.begin(), inputs.structure.end());
     return success;
 }
 
 return_code interface_driver::read_report(const call_inputs& inputs, call_outputs& outputs) {
     const auto id = narrow_scalar(inputs.scalars[0]);
+    const auto source = id ? report_sources_.find(*id) : report_sources_.end();
+    if (source != report_sources_.end()) {
+        byte_list reply;
+        const return_code made = source->second(outputs.structure.size(), reply);
+        return made == success ? answer(reply, outputs) : made;
+    }
     const byte_list* bytes = id ? report(*id) : nullptr;
     return bytes == nullptr ? unsupported : answer(*bytes, outputs);
 }

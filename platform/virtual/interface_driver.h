@@ -21,8 +21,23 @@ public:
     // Carries out a command: the payload goes in, the reply comes out.
     using command = std::function<return_code(byte_view payload, byte_list& reply)>;
 
+    // Makes a report when it is read: reply may become as long as room. Does what a report that is
+    // written asks for.
+    using report_source = std::function<return_code(std::size_t room, byte_list& reply)>;
+    using report_sink = std::function<return_code(byte_view report)>;
+
     // Gives the service a report; only reports that it has can be read or written.
     void set_report(std::uint32_t id, byte_list bytes) { reports_[id] = std::move(bytes); }
+
+    // Gives the service a report that is made anew whenever it is read.
+    void set_report_source(std::uint32_t id, report_source source) {
+        report_sources_[id] = std::move(source);
+    }
+
+    // Hands a report that the service has to sink before it is stored; it is stored on success.
+    void set_report_sink(std::uint32_t id, report_sink sink) {
+        report_sinks_[id] = std::move(sink);
+    }
 
     // Takes a report away again.
     void drop_report(std::uint32_t id) { reports_.erase(id); }
@@ -47,6 +62,8 @@ private:
     return_code read_named_property(const call_inputs& inputs, call_outputs& outputs);
 
     std::map<std::uint32_t, byte_list> reports_;
+    std::map<std::uint32_t, report_source> report_sources_;
+    std::map<std::uint32_t, report_sink> report_sinks_;
     std::map<std::uint32_t, command> commands_;
     std::map<std::string, byte_list, std::less<>> named_properties_;
     bool has_named_properties_ = false;

@@ -16,6 +16,7 @@ std::unique_ptr<machine> make_wrist_device() {
     add_error_statistics(*device);
     add_sample_ranges(*device);
     add_clocks(*device);
+    add_profiler(*device);
     return device;
 }
 

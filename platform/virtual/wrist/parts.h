@@ -32,4 +32,7 @@ void add_sample_ranges(machine& device);
 // The boot time, and the time-sync service.
 void add_clocks(machine& device);
 
+// The profiler: the kernel's driver, and the service "profile".
+void add_profiler(machine& device);
+
 }  // namespace platform::simulated
