@@ -8,6 +8,7 @@
 #include "nrxctl/base/profile_records.h"
 #include "nrxctl/base/service_conn.h"
 #include "nrxctl/base/service_discovery.h"
+#include "nrxctl/base/service_list.h"
 #include "nrxctl/base/service_property.h"
 
 // Reports as text
@@ -18,10 +19,16 @@
 #include "nrxctl/printers/spi_status.h"
 #include "nrxctl/printers/value_printers.h"
 
+// The profiler
+#include "nrxctl/profiler/profile_command.h"
+#include "nrxctl/profiler/scm_monitor.h"
+
 // Words in, lines out
 #include "nrxctl/base/end_process.h"
 #include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/numbers.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/payload.h"
+#include "nrxctl/base/refuse_word.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/tick_period.h"

@@ -101,9 +101,9 @@ bool data_available(const mapped_memory& queue) {
 
 return_code dequeue(const mapped_memory& queue, byte_span& entry) {
     machine& host = current_machine();
-    const queue_mapping* mapping = host.mapping(queue.id());
-    const auto how = host.begin_call(
-        [&] { return "dequeue " + name_of(mapping) + " room " + std::to_string(entry.size()); });
+    const auto how = host.begin_call([&] {
+        return "dequeue " + name_of(host, queue.id()) + " room " + std::to_string(entry.size());
+    });
     if (how) {
         if (*how == failure::nothing) entry = {};
         return code_of(*how);

@@ -1,6 +1,8 @@
 // The parts that the wrist device is put together from, one file each.
 #pragma once
 
+#include <cstdint>
+
 #include "platform/virtual/machine.h"
 
 namespace platform::simulated {
@@ -32,7 +34,8 @@ void add_sample_ranges(machine& device);
 // The boot time, and the time-sync service.
 void add_clocks(machine& device);
 
-// The profiler: the kernel's driver, and the service "profile".
-void add_profiler(machine& device);
+// The profiler: the kernel's driver, and the service "profile". When it is enabled, as many events
+// happen in a second.
+void add_profiler(machine& device, std::uint32_t events_per_second = 50);
 
 }  // namespace platform::simulated

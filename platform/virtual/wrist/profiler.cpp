@@ -7,13 +7,7 @@
 
 namespace platform::simulated {
 
-namespace {
-
-constexpr std::uint32_t events_per_second = 50;
-
-}  // namespace
-
-void add_profiler(machine& device) {
+void add_profiler(machine& device, std::uint32_t events_per_second) {
     const auto shared = add_profiler_driver(device);
     shared->stream()->set_rate(events_per_second);
     shared->dump_errors();

@@ -1,0 +1,210 @@
+// nrxctl: the entry points of the tool library at a person's hand.
+
+#include <array>
+#include <cstdlib>
+#include <getopt.h>
+#include <limits>
+#include <optional>
+#include <span>
+#include <string>
+#include <vector>
+
+#include "nrxctl/nrxtoollib.h"
+#include "platform/clock.h"
+
+namespace {
+
+using namespace nrx;
+
+constexpr int misuse_status = 2;
+constexpr std::size_t usual_report_capacity = 65'536;
+constexpr std::size_t largest_report_capacity = 1 << 20;
+
+// How an option went. The two command families say all that there is to say themselves: they are
+// always done.
+enum class outcome { done, failed, misused };
+
+outcome outcome_of(platform::return_code result) {
+    return result == platform::success ? outcome::done : outcome::failed;
+}
+
+// What stands behind an option: the option's own argument and all words of the command line, with
+// the option parser's index.
+struct option_words {
+    std::string_view argument;
+    std::span<char* const> all;
+    int& index;
+
+    // The next word; none at the end, and before the next option.
+    [[nodiscard]] std::optional<std::string_view> take() const {
+        const auto next = static_cast<std::size_t>(index);
+        if (next >= all.size() || *all[next] == '-') return std::nullopt;
+        ++index;
+        return all[next];
+    }
+};
+
+std::uint32_t parse_up_to(std::int64_t largest, std::string_view word, std::string_view message) {
+    const std::int64_t number = parse_number(word, message);
+    if (number < 0 || number > largest) refuse_word(message, word);
+    return static_cast<std::uint32_t>(number);
+}
+
+std::uint32_t parse_report_id(std::string_view word) {
+    return parse_up_to(std::numeric_limits<std::uint8_t>::max(), word, "report id is invalid");
+}
+
+outcome profile(const option_words& words) {
+    profile_command(words.argument, words.all, words.index);
+    return outcome::done;
+}
+
+outcome scm(const option_words& words) {
+    scm_monitor(words.argument, words.all, words.index);
+    return outcome::done;
+}
+
+outcome list(const option_words& /*words*/) {
+    return outcome_of(list_services());
+}
+
+outcome read_report(const option_words& words) {
+    const auto id_word = words.take();
+    if (!id_word) return outcome::misused;
+    const std::uint32_t id = parse_report_id(*id_word);
+    std::size_t capacity = usual_report_capacity;
+    if (const auto word = words.take()) {
+        capacity = parse_up_to(largest_report_capacity, *word, "capacity is invalid");
+    }
+    std::vector<std::uint8_t> buffer(capacity);
+    platform::byte_span report = buffer;
+    const platform::return_code result = get_report(words.argument, id, report);
+    if (result != platform::success) return outcome::failed;
+    print_report(words.argument, static_cast<std::int32_t>(id), report);
+    return outcome::done;
+}
+
+outcome write_report(const option_words& words) {
+    const auto id_word = words.take();
+    if (!id_word) return outcome::misused;
+    const std::uint32_t id = parse_report_id(*id_word);
+    std::vector<std::uint8_t> payload;
+    parse_payload(words.all, words.index, payload);
+    if (payload.empty()) return outcome::misused;
+    return outcome_of(set_report(words.argument, id, payload));
+}
+
+outcome run_command(const option_words& words) {
+    const auto code_word = words.take();
+    if (!code_word) return outcome::misused;
+    const std::uint32_t code = parse_up_to(std::numeric_limits<std::uint32_t>::max(), *code_word,
+                                           "command code is invalid");
+    std::vector<std::uint8_t> payload;
+    parse_payload(words.all, words.index, payload);
+    std::vector<std::uint8_t> buffer(usual_report_capacity);
+    platform::byte_span reply = buffer;
+    const platform::return_code result = send_command(words.argument, code, payload, reply);
+    if (result == platform::success) hex_dump(reply);
+    return outcome_of(result);
+}
+
+outcome help(const option_words& words);
+
+outcome version(const option_words& /*words*/) {
+    print_line("nrxctl " NRXCTL_VERSION);
+    return outcome::done;
+}
+
+struct option_row {
+    const char* name;
+    bool takes_argument;
+    const char* words;
+    const char* purpose;
+    outcome (*run)(const option_words& words);
+};
+
+constexpr std::array option_rows{
+    option_row{"profile", true, "SUBCOMMAND [WORD...]",
+               "control the profiler; the subcommand help lists the others", profile},
+    option_row{"scm", true, "DURATION CONFIG...",
+               "print the coprocessor's bus transfers for DURATION milliseconds, or auto", scm},
+    option_row{"list", false, "", "list the interface services with their ids", list},
+    option_row{"report", true, "SERVICE ID [CAPACITY]", "read a report and print it", read_report},
+    option_row{"set-report", true, "SERVICE ID [u8|u16|u32] VALUE...", "write a report",
+               write_report},
+    option_row{"command", true, "SERVICE CODE [u8|u16|u32] [VALUE...]",
+               "send a command and dump its reply", run_command},
+    option_row{"help", false, "", "print this help", help},
+    option_row{"version", false, "", "print the version", version},
+};
+
+outcome help(const option_words& /*words*/) {
+    constexpr std::size_t usage_width = 50;
+    print_line("usage: nrxctl OPTION...");
+    for (const option_row& row : option_rows) {
+        text_line usage;
+        usage.text("--").text(row.name).text(" ").text(row.words);
+        print_line(text_line()
+                       .text("  ")
+                       .left(usage.view(), usage_width)
+                       .text(" ")
+                       .text(row.purpose)
+                       .view());
+    }
+    print_line("Options are carried out in order. A SERVICE is a registry name or a service id;");
+    print_line("VALUEs are hexadecimal, or decimal after 0d.");
+    return outcome::done;
+}
+
+int refuse(std::string_view problem, std::string_view word) {
+    text_line lines;
+    lines.text("nrxctl: ").text(problem).text(" ").text(word).text("\n");
+    write_error(lines.text("Try nrxctl --help.\n").view());
+    return misuse_status;
+}
+
+// What the parser takes: a row's number is the value of its option.
+std::array<option, option_rows.size() + 1> parser_options() {
+    std::array<option, option_rows.size() + 1> options{};
+    for (std::size_t i = 0; i < option_rows.size(); ++i) {
+        const option_row& row = option_rows[i];
+        options[i] = {row.name, row.takes_argument ? required_argument : no_argument, nullptr,
+                      static_cast<int>(i)};
+    }
+    return options;
+}
+
+// Carries the options out in order; the exit status.
+int run(int argc, char** argv) {
+    const std::span<char* const> words(argv, static_cast<std::size_t>(argc));
+    const auto options = parser_options();
+    int status = EXIT_SUCCESS;
+    if (argc < 2) return refuse("an option is", "needed");
+    while (true) {
+        const int parsed = getopt_long(argc, argv, "+:", options.data(), nullptr);
+        if (parsed == -1) break;
+        if (parsed == ':') return refuse("a word is missing after", argv[optind - 1]);
+        if (parsed == '?') return refuse("unknown option", argv[optind - 1]);
+        const option_row& row = option_rows[static_cast<std::size_t>(parsed)];
+        const option_words further{optarg == nullptr ? "" : optarg, words, optind};
+        switch (row.run(further)) {
+            case outcome::done:
+                break;
+            case outcome::failed:
+                status = EXIT_FAILURE;
+                break;
+            case outcome::misused:
+                return refuse("a word is missing after", std::string("--") + row.name);
+        }
+    }
+    if (optind < argc) return refuse("unknown word", argv[optind]);
+    return status;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    survive_closed_pipes();
+    tick_period = platform::tick_period();
+    return run(argc, argv);
+}

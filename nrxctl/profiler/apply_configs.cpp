@@ -1,0 +1,48 @@
+#include "nrxctl/profiler/apply_configs.h"
+
+#include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/output.h"
+#include "nrxctl/profiler/fw_profiler.h"
+#include "nrxctl/profiler/profiler_conn.h"
+
+namespace nrx {
+
+namespace {
+
+constexpr std::string_view kernel_refusal = "kext config: At least one config failed";
+
+platform::return_code send_to_kernel(const profiler_conn& conn,
+                                     std::span<const profiler_config> configs) {
+    const auto records = encode_configs(configs);
+    platform::call_outputs nothing;
+    return platform::call(conn.connection(), profiler_method::configure, {{}, records}, nothing);
+}
+
+bool configure_kernel(std::span<const profiler_config> configs) {
+    profiler_conn conn;
+    const bool success = conn.open(presence::is_required);
+    if (!check(success, "success")) {
+        print_line(kernel_refusal);
+        return true;
+    }
+    const platform::return_code result = send_to_kernel(conn, configs);
+    if (result == platform::unsupported) {
+        print_line(kernel_refusal);
+        return true;
+    }
+    return check_success(result, "result == 0 ");
+}
+
+}  // namespace
+
+bool apply_profiler_configs(std::span<const profiler_config> configs) {
+    const platform::return_code result = send_fw_configs(configs);
+    if (result == platform::unsupported) {
+        print_line("fw config: At least one config failed");
+    } else if (!check_success(result, "result == 0 ")) {
+        return false;
+    }
+    return configure_kernel(configs);
+}
+
+}  // namespace nrx

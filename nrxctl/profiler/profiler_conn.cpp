@@ -1,0 +1,36 @@
+#include "nrxctl/profiler/profiler_conn.h"
+
+#include "nrxctl/base/failure_report.h"
+
+namespace nrx {
+
+namespace {
+
+constexpr std::uint32_t event_queue_memory = 0;
+constexpr std::uint32_t event_notification = 0;
+
+}  // namespace
+
+bool profiler_conn::open(presence driver) {
+    service_ = platform::first_match({{std::string(platform::name_match_key), name_}});
+    if (!service_ && driver == presence::is_optional) return false;
+    if (!check(service_, "service")) return false;
+    const platform::return_code kr = platform::open(service_, 0, connection_);
+    if (!check_success(kr, "kr == 0 ")) return false;
+    return check(connection_, "connect");
+}
+
+bool profiler_conn::open_queue(presence mapping) {
+    const bool success = open(presence::is_required);
+    if (!check(success, "success")) return false;
+    platform::return_code kr = platform::map_memory(connection_, event_queue_memory, queue_);
+    if (kr != platform::success && mapping == presence::is_optional) return false;
+    if (!check_success(kr, "kr == 0 ")) return false;
+    if (!check(queue_, "queue")) return false;
+    port_ = platform::allocate_port();
+    if (!check(port_, "rxPort")) return false;
+    kr = platform::attach_port(connection_, event_notification, port_, 0);
+    return check_success(kr, "kr == 0 ");
+}
+
+}  // namespace nrx

@@ -1,0 +1,182 @@
+// nrxctl as a process, on the embedded device.
+#include "tests/support/program.h"
+
+#include <algorithm>
+#include <chrono>
+#include <sstream>
+#include <thread>
+
+#include <gtest/gtest.h>
+
+#include "tests/support/running_program.h"
+
+namespace {
+
+using namespace std::chrono_literals;
+using tests::program_result;
+using tests::run_program;
+using tests::running_program;
+using words = std::vector<std::string>;
+
+const std::string program = NRXCTL_PROGRAM;
+
+program_result run(const words& arguments) {
+    return run_program(program, arguments);
+}
+
+std::vector<std::string> lines_of(const std::string& text) {
+    std::vector<std::string> lines;
+    std::istringstream from(text);
+    for (std::string line; std::getline(from, line);)
+        lines.push_back(line);
+    return lines;
+}
+
+const std::string hint = "Try nrxctl --help.\n";
+
+TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
+    struct misuse_row {
+        words arguments;
+        std::string problem;
+    };
+    const std::vector<misuse_row> rows{
+        {{}, "an option is needed"},
+        {{"--foo"}, "unknown option --foo"},
+        {{"-x"}, "unknown option -x"},
+        {{"list"}, "unknown word list"},
+        {{"--list", "more"}, "unknown word more"},
+        {{"--profile"}, "a word is missing after --profile"},
+        {{"--report", "accel"}, "a word is missing after --report"},
+        {{"--report", "accel", "--list"}, "a word is missing after --report"},
+        {{"--set-report", "accel", "1"}, "a word is missing after --set-report"},
+        {{"--set-report", "accel"}, "a word is missing after --set-report"},
+        {{"--command", "accel"}, "a word is missing after --command"},
+        {{"--help=x"}, "unknown option --help=x"},
+    };
+    for (const misuse_row& row : rows) {
+        const auto result = run(row.arguments);
+        EXPECT_EQ(result.status, 2) << row.problem;
+        EXPECT_EQ(result.err, "nrxctl: " + row.problem + "\n" + hint);
+    }
+}
+
+TEST(nrxctl_program, numbers_that_are_none_or_out_of_range_end_it_with_status_1) {
+    EXPECT_EQ(run({"--report", "accel", "d0"}).out, "report id is invalid (d0)\n");
+    EXPECT_EQ(run({"--report", "accel", "256"}).out, "report id is invalid (256)\n");
+    EXPECT_EQ(run({"--report", "accel", "1", "0x100001"}).out, "capacity is invalid (0x100001)\n");
+    const auto result = run({"--command", "accel", "0x100000000"});
+    EXPECT_EQ(result.out, "command code is invalid (0x100000000)\n");
+    EXPECT_EQ(result.status, 1);
+}
+
+TEST(nrxctl_program, help_and_version_are_on_standard_output) {
+    const auto help = run({"--help"});
+    EXPECT_EQ(help.status, 0);
+    EXPECT_TRUE(help.out.starts_with("usage: nrxctl OPTION...\n  --profile SUBCOMMAND [WORD...] "));
+    EXPECT_EQ(run({"--version"}).out, "nrxctl " NRXCTL_VERSION "\n");
+}
+
+TEST(nrxctl_program, lists_every_interface_service_with_its_id) {
+    const auto lines = lines_of(run({"--list"}).out);
+    EXPECT_GT(lines.size(), 10U);
+    EXPECT_EQ(std::count(lines.begin(), lines.end(), "WQR_wqr-button           0x40"), 1);
+    EXPECT_EQ(std::count(lines.begin(), lines.end(), "profile                  0x50"), 1);
+}
+
+TEST(nrxctl_program, reads_writes_and_commands_and_tells_by_its_status_whether_all_went_well) {
+    EXPECT_EQ(run({"--report", "wqr-button", "0xd7"}).status, 0);
+    const auto chain = run({"--set-report", "profile", "0xd5", "u32", "1", "--report", "0x50",
+                            "0xd5", "--command", "profile", "0x21"});
+    EXPECT_EQ(chain.status, 0);
+    EXPECT_EQ(chain.out, "00000000: 01 00 00 00                                       | ....\n");
+    const auto failing = run({"--report", "nobody", "1", "--version"});
+    EXPECT_EQ(failing.status, 1);
+    EXPECT_NE(failing.err.find("Check failed: service bail"), std::string::npos);
+    EXPECT_EQ(failing.out, "nrxctl " NRXCTL_VERSION "\n");
+    EXPECT_EQ(run({"--command", "profile", "0x7f", "1", "2"}).out,
+              "command 0x7f is not supported for device\n"
+              "payload 00000000: 01 02                                             | ..\n");
+    EXPECT_EQ(run({"--command", "profile", "0x7f"}).status, 1);
+    EXPECT_EQ(run({"--report", "profile", "0xd5", "3"}).status, 1);
+    EXPECT_EQ(run({"--profile", "config", "bogus"}).status, 0);
+}
+
+TEST(nrxctl_program, profiles_for_a_time_and_puts_everything_back) {
+    const auto started = std::chrono::steady_clock::now();
+    const auto whole =
+        run({"--profile", "human", "300", "sensor:accel,gyro:data", "exec:command:command:all"});
+    EXPECT_GE(std::chrono::steady_clock::now() - started, 400ms);
+    EXPECT_EQ(whole.status, 0);
+    EXPECT_EQ(whole.err, "");
+    const auto lines = lines_of(whole.out);
+    ASSERT_GE(lines.size(), 12U);
+    EXPECT_EQ(lines.front(), "duration=300000 us mode=enable (humanReadable=enabled)");
+    EXPECT_EQ(lines.back(), "done");
+    const auto holding = [&](const std::string& text) {
+        return std::count_if(lines.begin(), lines.end(), [&](const std::string& line) {
+            return line.find(text) != std::string::npos;
+        });
+    };
+    EXPECT_EQ(holding("'component': 'accel', 'event':      'data'"), 5);
+    EXPECT_EQ(holding("'component':  'gyro', 'event':      'data'"), 5);
+    EXPECT_EQ(holding("'component':'command'"), 5);
+    EXPECT_EQ(holding("'category':'control'"), 3);
+}
+
+TEST(nrxctl_program, prints_the_transfers_of_a_bus) {
+    const auto result = run({"--scm", "200", "scm:smb0:ch4"});
+    EXPECT_EQ(result.err, "");
+    const auto lines = lines_of(result.out);
+    ASSERT_GT(lines.size(), 4U);
+    EXPECT_TRUE(lines[0].starts_with("smb0.4: scm_read wqr_timestamp="));
+    EXPECT_TRUE(lines[1].starts_with("smb0.4:   data[0-"));
+    EXPECT_EQ(lines.back(), "done");
+}
+
+TEST(nrxctl_program, monitor_blocks_without_processor_time_and_ends_at_once_when_interrupted) {
+    running_program monitor(program, {"--profile", "monitor"});
+    ASSERT_TRUE(monitor.wait_for("humanReadable=disabled)\n"));
+    std::this_thread::sleep_for(500ms);
+    const auto interrupted = std::chrono::steady_clock::now();
+    monitor.send_interrupt();
+    EXPECT_EQ(monitor.finish(), 0);
+    const auto took = std::chrono::steady_clock::now() - interrupted;
+    EXPECT_GE(took, 90ms);
+    EXPECT_LT(took, 3s);
+    EXPECT_TRUE(monitor.out().ends_with("\ndone\n"));
+    EXPECT_LT(monitor.processor_time(), 0.1);
+}
+
+TEST(nrxctl_program, interrupted_as_soon_as_it_begins_to_monitor_it_ends_all_the_same) {
+    for (int round = 0; round < 10; ++round) {
+        running_program monitor(program, {"--profile", "human", "auto", "wake:all"});
+        ASSERT_TRUE(monitor.wait_for("humanReadable=enabled)\n"));
+        std::this_thread::sleep_for(round * 200us);
+        monitor.send_interrupt();
+        EXPECT_EQ(monitor.finish(), 0);
+        EXPECT_TRUE(monitor.out().ends_with("done\n"));
+    }
+}
+
+TEST(nrxctl_program, interrupted_in_a_stream_twice_and_in_the_grace_it_ends_once) {
+    running_program monitor(program, {"--profile", "auto", "sensor:accel:data"});
+    ASSERT_TRUE(monitor.wait_for("prof-event 02020002"));
+    monitor.send_interrupt();
+    monitor.send_interrupt();
+    std::this_thread::sleep_for(50ms);
+    monitor.send_interrupt();
+    EXPECT_EQ(monitor.finish(), 0);
+    EXPECT_TRUE(monitor.out().ends_with("\ndone\n"));
+}
+
+TEST(nrxctl_program, output_that_nobody_reads_ends_nothing) {
+    for (const auto target : {tests::output_to::closed_pipe, tests::output_to::full_device,
+                              tests::output_to::nowhere}) {
+        const auto result =
+            run_program(program, {"--profile", "human", "60", "sensor:accel"}, target);
+        EXPECT_EQ(result.status, 0);
+        EXPECT_EQ(result.err, "");
+    }
+}
+
+}  // namespace

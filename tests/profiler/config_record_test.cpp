@@ -1,0 +1,89 @@
+#include "nrxctl/profiler/config_printer.h"
+#include "nrxctl/profiler/profiler_config.h"
+#include "tests/profiler/profiler_host.h"
+
+namespace tests {
+
+using nrx::profiler_config;
+using nrx::profiler_state;
+
+namespace {
+
+const byte_list example_record = joined({
+    words_of({0x0a, 0x04030201, 1, 0x08070605}),
+    {'a', 'l', 'l', 0, 's', 'e', 'n', 's', 'x', 0, 0, 0},
+    words_of({4, 5, 6, 7, 8}),
+    words_of({0}),
+});
+
+}  // namespace
+
+TEST(config_record, is_52_bytes_with_every_field_in_its_place) {
+    const auto read = nrx::decode_configs(example_record);
+    ASSERT_EQ(read.size(), 1U);
+    EXPECT_EQ(read[0].profiler, 0x0aU);
+    EXPECT_EQ(read[0].component, 0x04030201U);
+    EXPECT_EQ(read[0].state, profiler_state::disable);
+    EXPECT_EQ(read[0].reports, 0x08070605U);
+    const std::array<std::uint32_t, 8> services{0x006c6c61, 0x736e6573, 0x78, 4, 5, 6, 7, 8};
+    EXPECT_EQ(read[0].services, services);
+    EXPECT_EQ(nrx::encode_configs(read), example_record);
+}
+
+TEST(config_record, follows_another_and_a_part_of_one_is_none) {
+    byte_list bytes = joined({example_record, example_record});
+    EXPECT_EQ(nrx::decode_configs(bytes).size(), 2U);
+    bytes.pop_back();
+    EXPECT_EQ(nrx::decode_configs(bytes).size(), 1U);
+    bytes.resize(51);
+    EXPECT_TRUE(nrx::decode_configs(bytes).empty());
+    EXPECT_TRUE(nrx::encode_configs({}).empty());
+}
+
+TEST(config_record, service_codes_are_four_characters_the_first_lowest) {
+    EXPECT_EQ(nrx::service_code("all"), 0x006c6c61U);
+    EXPECT_EQ(nrx::service_code("ab"), 0x6261U);
+    EXPECT_EQ(nrx::service_code("sensors"), 0x736e6573U);
+    EXPECT_EQ(nrx::service_code(""), 0U);
+    EXPECT_EQ(nrx::service_code("\xff"), 0xffU);
+}
+
+TEST(config_record, prints_as_a_line) {
+    struct print_row {
+        profiler_config config;
+        std::string line;
+    };
+    constexpr auto unknown_state = static_cast<profiler_state>(3);
+    const std::vector<print_row> rows{
+        {{.profiler = 2, .component = 1, .reports = 0x5},
+         "    profiler sensor     is enabled [component=gyro, reports=5]\n"},
+        {{.profiler = 2, .component = 9, .state = profiler_state::disable, .reports = 0},
+         "    profiler sensor     is disabled [component=9, reports=0]\n"},
+        {{.profiler = 10, .state = profiler_state::stop},
+         "    profiler wake       is stopd [component=, reports=ffffffff]\n"},
+        {{.profiler = 5, .state = unknown_state, .reports = 0xffff},
+         "    profiler interrupt  is unknownd [component=gpio, reports=ffff]\n"},
+        {{.profiler = 7, .component = 3},
+         "    profiler 7          is enabled [component=3, reports=ffffffff]\n"},
+        {{.profiler = 8, .component = 2},
+         "    profiler control    is enabled [component=2, reports=ffffffff]\n"},
+        {{.profiler = 4294967295, .component = 4294967295},
+         "    profiler 4294967295 is enabled [component=4294967295, reports=ffffffff]\n"},
+        {{.profiler = 0, .component = 3, .reports = 0x1f, .services = {0x006c6c61}},
+         "    profiler exec       is enabled [component=command, reports=1f services= all]\n"},
+        {{.profiler = 0, .component = 4, .services = {0x736e6573, 0x62, 0, 0x63}},
+         "    profiler exec       is enabled [component=extfunction, reports=ffffffff services= "
+         "sens b]\n"},
+        {{.profiler = 0, .component = 2, .services = {0x61}},
+         "    profiler exec       is enabled [component=workloop, reports=ffffffff]\n"},
+        {{.profiler = 1, .component = 4},
+         "    profiler trace      is enabled [component=4, reports=ffffffff services=]\n"},
+        {{.profiler = 1, .component = 3, .services = {0x62006100, 0x61}},
+         "    profiler trace      is enabled [component=interrupt, reports=ffffffff services=  "
+         "a]\n"},
+    };
+    for (const print_row& row : rows)
+        EXPECT_EQ(capture([&] { nrx::print_profiler_config(row.config); }).out, row.line);
+}
+
+}  // namespace tests

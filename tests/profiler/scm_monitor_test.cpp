@@ -1,0 +1,113 @@
+#include "nrxctl/profiler/scm_monitor.h"
+
+#include "nrxctl/base/tick_period.h"
+#include "platform/clock.h"
+#include "tests/profiler/profiler_host.h"
+
+namespace tests {
+
+using lines = std::vector<std::string>;
+
+namespace {
+
+constexpr const char* scm_file = "profiler/scm_monitor.cpp";
+constexpr const char* kernel = "profiler/kernel_profiler.cpp";
+
+// A configuration record of "scm".
+std::string config(const std::string& component, const std::string& state,
+                   const std::string& mask) {
+    std::string bytes = "09 00 00 00 " + component + " 00 00 00 " + state + " 00 00 00 " + mask;
+    for (int i = 0; i < 36; ++i)
+        bytes += " 00";
+    return "call profile 3 scalars [0x24] in [" + bytes + "] results 0 room 0";
+}
+
+const std::string enable_call = "call KeltoNRXProfileDriver 0 scalars [0x1] in [] results 0 room 0";
+const std::string disable_call =
+    "call KeltoNRXProfileDriver 0 scalars [0x0] in [] results 0 room 0";
+const std::string status_call = "call KeltoNRXProfileDriver 1 scalars [] in [] results 1 room 0";
+const std::string duration_call = "call profile 1 scalars [0xd2] in [10 27 00 00] results 0 room 0";
+const std::string log_call = "call profile 2 scalars [0xd1] in [] results 0 room 65536";
+const std::string stop_call = config("00", "02", "ff ff ff ff");
+const std::string start_call = config("02", "00", "80 00 00 00");
+
+}  // namespace
+
+class scm_monitor : public profiler_test {
+protected:
+    void SetUp() override {
+        profiler_test::SetUp();
+        nrx::tick_period = platform::tick_period();
+    }
+
+    // A transfer on smb1, channel 7, and the end of the stream.
+    void stream_a_transfer() {
+        byte_list transfer = joined({{3, 7, 2, 9}, words_of({1, 100, 0, 1, 5000}), byte_list(24)});
+        driver->queue->add(transfer);
+        driver->queue->add(record_bytes(0, 0));
+    }
+
+    outcome monitor(std::string duration, std::vector<std::string> words) {
+        std::vector<char*> argv;
+        for (std::string& word : words)
+            argv.push_back(word.data());
+        int index = 0;
+        return capture([&] { nrx::scm_monitor(duration, argv, index); });
+    }
+};
+
+TEST_F(scm_monitor, configures_the_coprocessor_alone_and_prints_the_transfers) {
+    put_both_halves();
+    stream_a_transfer();
+    const outcome written = monitor("10", {"scm:smb1:ch7"});
+    EXPECT_EQ(written.out, "smb1.7: scm_write wqr_timestamp=100 scm_timestamp=5000\ndone\n");
+    EXPECT_EQ(written.err, "");
+    EXPECT_EQ(logged("call"), (lines{status_call, enable_call, start_call, duration_call, log_call,
+                                     stop_call, disable_call}));
+}
+
+TEST_F(scm_monitor, leaves_the_profiler_enabled_for_a_client_that_is_connected) {
+    put_both_halves();
+    driver->answers[1] = {{.scalar = 1}};
+    stream_a_transfer();
+    EXPECT_EQ(monitor("10", {"scm:smb1:ch7"}).err, "");
+    EXPECT_EQ(logged("call"), (lines{status_call, start_call, duration_call, log_call, stop_call}));
+}
+
+TEST_F(scm_monitor, disables_what_it_enabled_after_every_failure) {
+    put_both_halves();
+    service->set_command(0x24,
+                         [](platform::byte_view, byte_list&) { return platform::unsupported; });
+    const outcome refused = monitor("10", {"scm:smb1:ch7"});
+    EXPECT_EQ(refused.out, "Can't enable SCM profiler\n");
+    EXPECT_EQ(refused.err, failed(scm_file, "success"));
+    EXPECT_EQ(logged("call"), (lines{status_call, enable_call, start_call, disable_call}));
+    happened();
+
+    service->set_command(0x24, [times = 0](platform::byte_view, byte_list&) mutable {
+        return times++ == 0 ? platform::success : platform::simulated::io_failure;
+    });
+    driver->queue = nullptr;
+    const outcome unmapped = monitor("10", {"scm:smb1:ch7"});
+    EXPECT_TRUE(unmapped.err.ends_with(failed("profiler/monitor.cpp", "success") +
+                                       failed(scm_file, "success")));
+    EXPECT_EQ(logged("call").back(), disable_call);
+}
+
+TEST_F(scm_monitor, ends_early_without_profiler_status_duration_or_configurations) {
+    EXPECT_EQ(monitor("10", {"scm:smb1"}).out, "wqr fw profiler is not available\n");
+    put_profile_service();
+    EXPECT_EQ(monitor("10", {"scm:smb1"}).err, failed("profiler/profiler_conn.cpp", "service") +
+                                                   failed(kernel, "success") +
+                                                   failed(scm_file, "success"));
+    put_driver();
+    EXPECT_EQ(monitor("10", {}).err, failed(scm_file, "configs.size() != 0"));
+    EXPECT_EQ(monitor("auto", {"smb1"}).err,
+              failed("profiler/config_grammar.cpp", "result") + failed(scm_file, "success"));
+    const outcome refused = monitor("human", {"scm:smb1"});
+    EXPECT_EQ(refused.out, "duration parameter is invalid (human)\n");
+    EXPECT_EQ(refused.status, 1);
+    EXPECT_EQ(logged("call"), lines(3, status_call));
+}
+
+}  // namespace tests

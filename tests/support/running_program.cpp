@@ -1,0 +1,87 @@
+#include "tests/support/running_program.h"
+
+#include <array>
+#include <chrono>
+#include <csignal>
+#include <fcntl.h>
+#include <poll.h>
+#include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+namespace tests {
+
+namespace {
+
+[[noreturn]] void become(const std::string& path, const std::vector<std::string>& arguments,
+                         int output) {
+    std::vector<char*> words{const_cast<char*>(path.c_str())};
+    for (const std::string& word : arguments)
+        words.push_back(const_cast<char*>(word.c_str()));
+    words.push_back(nullptr);
+    ::dup2(output, STDOUT_FILENO);
+    ::dup2(::open("/dev/null", O_WRONLY | O_CLOEXEC), STDERR_FILENO);
+    ::execv(path.c_str(), words.data());
+    ::_exit(127);
+}
+
+double seconds(const timeval& time) {
+    return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
+}
+
+}  // namespace
+
+running_program::running_program(const std::string& path,
+                                 const std::vector<std::string>& arguments) {
+    std::array<int, 2> ends{};
+    if (::pipe2(ends.data(), O_CLOEXEC) != 0) return;
+    child_ = ::fork();
+    if (child_ == 0) become(path, arguments, ends[1]);
+    ::close(ends[1]);
+    output_ = ends[0];
+}
+
+running_program::~running_program() {
+    if (child_ > 0) {
+        ::kill(child_, SIGKILL);
+        ::waitpid(child_, nullptr, 0);
+    }
+    ::close(output_);
+}
+
+bool running_program::read_more() {
+    std::array<char, 65536> part;
+    const ssize_t got = ::read(output_, part.data(), part.size());
+    if (got > 0) out_.append(part.data(), static_cast<std::size_t>(got));
+    return got > 0;
+}
+
+bool running_program::wait_for(const std::string& text) {
+    const auto deadline = std::chrono::steady_clock::now() + std::chrono::seconds(10);
+    while (out_.find(text) == std::string::npos) {
+        const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(
+            deadline - std::chrono::steady_clock::now());
+        pollfd readable{output_, POLLIN, 0};
+        if (left.count() <= 0 || ::poll(&readable, 1, static_cast<int>(left.count())) <= 0)
+            return false;
+        if (!read_more()) return false;
+    }
+    return true;
+}
+
+void running_program::send_interrupt() const {
+    ::kill(child_, SIGINT);
+}
+
+int running_program::finish() {
+    while (read_more()) {
+    }
+    int status = 0;
+    rusage used{};
+    ::wait4(child_, &status, 0, &used);
+    child_ = -1;
+    processor_time_ = seconds(used.ru_utime) + seconds(used.ru_stime);
+    return WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
+}
+
+}  // namespace tests
