@@ -59,7 +59,8 @@ protected:
     scripted_driver& put_driver();
     interface_driver& put_profile_service();
 
-    // The calls and what else happened on the host since the last time, but for look-ups.
+    // The calls and what else happened on the host since the last time, but for services looked up
+    // and released.
     std::vector<std::string> happened();
 
     // Runs a subcommand as the command line gives it.
