@@ -179,12 +179,14 @@ int run(int argc, char** argv) {
     const std::span<char* const> words(argv, static_cast<std::size_t>(argc));
     const auto options = parser_options();
     int status = EXIT_SUCCESS;
-    if (argc < 2) return refuse("an option is", "needed");
+    bool has_options = false;
     while (true) {
+        const char* word = optind < argc ? argv[optind] : "";
         const int parsed = getopt_long(argc, argv, "+:", options.data(), nullptr);
         if (parsed == -1) break;
-        if (parsed == ':') return refuse("a word is missing after", argv[optind - 1]);
-        if (parsed == '?') return refuse("unknown option", argv[optind - 1]);
+        if (parsed == ':') return refuse("a word is missing after", word);
+        if (parsed == '?') return refuse("unknown option", word);
+        has_options = true;
         const option_row& row = option_rows[static_cast<std::size_t>(parsed)];
         const option_words further{optarg == nullptr ? "" : optarg, words, optind};
         switch (row.run(further)) {
@@ -198,7 +200,7 @@ int run(int argc, char** argv) {
         }
     }
     if (optind < argc) return refuse("unknown word", argv[optind]);
-    return status;
+    return has_options ? status : refuse("an option is", "needed");
 }
 
 }  // namespace

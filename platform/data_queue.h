@@ -23,7 +23,8 @@ return_code dequeue(const mapped_memory& queue, byte_span& entry);
 // Blocks, without using the processor and without a time-out, until the queue holds data; returns
 // at once if it does already. The driver must have been given the port to signal on. The interrupt
 // handler runs inside. Fails with bad_argument if the queue is not mapped or the port is not the
-// one that is signalled for it, and with not_found if the driver is gone or goes.
+// one that is signalled for it, with not_found if the driver is gone or goes, and with the host's
+// code if nothing can ever end the wait.
 return_code wait_for_data(const mapped_memory& queue, const notification_port& port);
 
 }  // namespace platform

@@ -1,5 +1,7 @@
 #include "nrxctl/profiler/apply_configs.h"
 
+#include <optional>
+
 #include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/profiler/fw_profiler.h"
@@ -11,26 +13,23 @@ namespace {
 
 constexpr std::string_view kernel_refusal = "kext config: At least one config failed";
 
-platform::return_code send_to_kernel(const profiler_conn& conn,
-                                     std::span<const profiler_config> configs) {
+// The driver's answer; none if there is no connection to ask on.
+std::optional<platform::return_code> send_to_kernel(std::span<const profiler_config> configs) {
+    profiler_conn conn;
+    if (!conn.open(presence::is_required)) return std::nullopt;
     const auto records = encode_configs(configs);
     platform::call_outputs nothing;
     return platform::call(conn.connection(), profiler_method::configure, {{}, records}, nothing);
 }
 
 bool configure_kernel(std::span<const profiler_config> configs) {
-    profiler_conn conn;
-    const bool success = conn.open(presence::is_required);
-    if (!check(success, "success")) {
+    const auto result = send_to_kernel(configs);
+    const bool success = result.has_value();
+    if (!check(success, "success") || *result == platform::unsupported) {
         print_line(kernel_refusal);
         return true;
     }
-    const platform::return_code result = send_to_kernel(conn, configs);
-    if (result == platform::unsupported) {
-        print_line(kernel_refusal);
-        return true;
-    }
-    return check_success(result, "result == 0 ");
+    return check_success(*result, "result == 0 ");
 }
 
 }  // namespace

@@ -38,7 +38,8 @@ void sleep(std::chrono::microseconds duration) {
 
 std::optional<calendar_instant> boot_time() {
     simulated::machine& host = simulated::current_machine();
-    if (host.begin_call([] { return std::string("boot time"); })) return std::nullopt;
+    const auto how = host.begin_call([] { return std::string("boot time"); });
+    if (how) return std::nullopt;
     return host.boot_time();
 }
 

@@ -32,8 +32,8 @@ return_code check_mapping(const queue_mapping* mapping) {
 }
 
 // Waits until the queue holds data, its driver is gone, or, which only the manual clock can tell,
-// nothing can ever happen any more. The mapping is kept: an interrupt handler may take back others.
-return_code wait_on(machine& host, const queue_mapping mapping) {
+// nothing can ever happen any more.
+return_code wait_on(machine& host, const queue_mapping& mapping) {
     while (mapping.provider->present) {
         simulated::serve_interrupt();
         mapping.queue->catch_up();
@@ -128,7 +128,8 @@ return_code wait_for_data(const mapped_memory& queue, const notification_port& p
     const return_code usable = check_mapping(mapping);
     if (usable != success) return usable;
     if (host.attached_queue(port.id()) != mapping->queue) return bad_argument;
-    return wait_on(host, *mapping);
+    const queue_mapping kept = *mapping;  // an interrupt handler may change what is lent out
+    return wait_on(host, kept);
 }
 
 }  // namespace platform

@@ -43,7 +43,8 @@ dictionary matching_class(std::string_view class_name) {
 
 service first_match(const dictionary& matching) {
     machine& host = current_machine();
-    if (host.begin_call([&] { return "first match " + describe(matching); })) return {};
+    const auto how = host.begin_call([&] { return "first match " + describe(matching); });
+    if (how) return {};
     const auto& candidates = possible_matches(host, matching);
     const auto found = std::find_if(
         candidates.begin(), candidates.end(),
@@ -67,7 +68,8 @@ return_code all_matches(const dictionary& matching, std::vector<service>& found)
 service first_child(const service& parent, std::string_view plane) {
     machine& host = current_machine();
     const entry_ref entry = host.service(parent.id());
-    if (host.begin_call([&] { return "first child of " + name_of(entry); })) return {};
+    const auto how = host.begin_call([&] { return "first child of " + name_of(entry); });
+    if (how) return {};
     if (!entry || !entry->present || plane != service_plane) return {};
     const auto child = std::find_if(entry->children.begin(), entry->children.end(),
                                     [](const entry_ref& one) { return one->present; });
@@ -77,7 +79,8 @@ service first_child(const service& parent, std::string_view plane) {
 return_code entry_name(const service& entry, std::string& name) {
     machine& host = current_machine();
     const entry_ref named = host.service(entry.id());
-    if (const auto how = host.begin_call([&] { return "name of " + name_of(named); })) {
+    const auto how = host.begin_call([&] { return "name of " + name_of(named); });
+    if (how) {
         if (*how == failure::nothing) name.clear();
         return code_of(*how);
     }
@@ -89,10 +92,9 @@ return_code entry_name(const service& entry, std::string& name) {
 bool read_property(const service& entry, std::string_view name, property& value) {
     machine& host = current_machine();
     const entry_ref owner = host.service(entry.id());
-    if (host.begin_call(
-            [&] { return "property of " + name_of(owner) + " " + std::string(name); })) {
-        return false;
-    }
+    const auto how =
+        host.begin_call([&] { return "property of " + name_of(owner) + " " + std::string(name); });
+    if (how) return false;
     if (!owner || !owner->present) return false;
     if (owner->refresh) owner->refresh(owner->properties);
     const property* own = owner->properties.find(name);

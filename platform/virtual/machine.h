@@ -44,7 +44,9 @@ public:
     begun_call(begun_call&&) = delete;
     begun_call& operator=(begun_call&&) = delete;
 
-    explicit operator bool() const { return how_.has_value(); }
+    // Not of a temporary: its end would come before that of the call.
+    explicit operator bool() const& { return how_.has_value(); }
+    explicit operator bool() const&& = delete;
     failure operator*() const { return *how_; }
 
 private:
@@ -109,7 +111,7 @@ public:
     // Every platform call that can fail starts here: it is counted and logged in the words that
     // describe_call gives. Returns how the call is to fail, if it is, to be kept until its end.
     template <class Describe>
-    begun_call begin_call(Describe describe_call) {
+    [[nodiscard]] begun_call begin_call(Describe describe_call) {
         if (recording_) log_.push_back(describe_call());
         return begun_call(count_call());
     }

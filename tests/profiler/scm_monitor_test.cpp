@@ -1,5 +1,8 @@
 #include "nrxctl/profiler/scm_monitor.h"
 
+#include <algorithm>
+#include <utility>
+
 #include "nrxctl/base/tick_period.h"
 #include "platform/clock.h"
 #include "tests/profiler/profiler_host.h"
@@ -64,6 +67,22 @@ TEST_F(scm_monitor, configures_the_coprocessor_alone_and_prints_the_transfers) {
     EXPECT_EQ(written.err, "");
     EXPECT_EQ(logged("call"), (lines{status_call, enable_call, start_call, duration_call, log_call,
                                      stop_call, disable_call}));
+}
+
+TEST_F(scm_monitor, takes_interrupts_until_just_before_it_disables) {
+    put_both_halves();
+    stream_a_transfer();
+    std::vector<std::pair<std::string, bool>> calls;
+    for (std::size_t call = 1; call < 100; ++call) {
+        host.before_call(call,
+                         [&] { calls.emplace_back(host.log().back(), has_default_action()); });
+    }
+    monitor("10", {"scm:smb1:ch7"});
+    const auto enabled = std::count(calls.begin(), calls.end(), std::pair(enable_call, false));
+    const auto disabled = std::count(calls.begin(), calls.end(), std::pair(disable_call, true));
+    EXPECT_EQ(enabled, 1);
+    EXPECT_EQ(disabled, 1);
+    EXPECT_TRUE(has_default_action());
 }
 
 TEST_F(scm_monitor, leaves_the_profiler_enabled_for_a_client_that_is_connected) {
