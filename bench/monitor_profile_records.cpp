@@ -31,8 +31,8 @@ public:
         const std::size_t records =
             std::fread(buffer_.data(), nrx::profile_record_size, buffer_.size(), file_.get());
         for (std::size_t i = 0; i < records; ++i)
-            add(entry(buffer_[i].begin(), buffer_[i].end()));
-        if (records == 0) add(entry(nrx::profile_record_size, 0));
+            add(buffer_[i]);
+        if (records == 0) add(nrx::profile_record{}.bytes);
     }
 
 private:

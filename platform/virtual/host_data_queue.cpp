@@ -13,7 +13,6 @@ using simulated::entry_ref;
 using simulated::failure;
 using simulated::machine;
 using simulated::queue_mapping;
-using simulated::shared_queue;
 
 namespace {
 
@@ -112,7 +111,7 @@ return_code dequeue(const mapped_memory& queue, byte_span& entry) {
     const return_code usable = check_mapping(mapping);
     if (usable != success) return usable;
     if (mapping->queue->empty()) return simulated::nothing_queued;
-    const shared_queue::entry& first = mapping->queue->first();
+    const byte_view first = mapping->queue->first();
     if (first.size() > entry.size()) return simulated::no_room;
     std::copy(first.begin(), first.end(), entry.begin());
     entry = entry.first(first.size());

@@ -118,6 +118,7 @@ void machine::before_call(std::size_t n, std::function<void()> action) {
 
 std::optional<failure> machine::count_call() {
     const std::size_t call = ++calls_made_;
+    if (actions_.empty() && failures_.empty()) return std::nullopt;
     const auto planned_actions = actions_;  // a copy, because an action may plan another
     for (const planned_action& planned : planned_actions) {
         if (planned.call == call) planned.run();

@@ -1,12 +1,14 @@
 // A queue in memory that a driver shares with the tool.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <deque>
+#include <initializer_list>
 #include <optional>
-#include <utility>
 #include <vector>
 
+#include "platform/bytes.h"
 #include "platform/virtual/machine_clock.h"
 
 namespace platform::simulated {
@@ -15,8 +17,6 @@ namespace platform::simulated {
 // catch up whenever the tool looks at the queue.
 class shared_queue {
 public:
-    using entry = std::vector<std::uint8_t>;
-
     shared_queue() = default;
     shared_queue(const shared_queue&) = delete;
     shared_queue& operator=(const shared_queue&) = delete;
@@ -35,15 +35,25 @@ public:
     // The tool has let go of the memory.
     virtual void unmapped() {}
 
-    void add(entry added) { entries_.push_back(std::move(added)); }
-    [[nodiscard]] bool empty() const { return entries_.empty(); }
-    [[nodiscard]] std::size_t size() const { return entries_.size(); }
-    [[nodiscard]] const entry& first() const { return entries_.front(); }
-    void drop_first() { entries_.pop_front(); }
-    void clear() { entries_.clear(); }
+    void add(byte_view entry);
+    void add(std::initializer_list<std::uint8_t> entry) {
+        add(byte_view(entry.begin(), entry.size()));
+    }
+    [[nodiscard]] bool empty() const { return sizes_.empty(); }
+    [[nodiscard]] std::size_t size() const { return sizes_.size(); }
+
+    // The first entry, until the next change of the queue; there must be one.
+    [[nodiscard]] byte_view first() const {
+        return byte_view(bytes_).subspan(first_, sizes_.front());
+    }
+    void drop_first();
+    void clear();
 
 private:
-    std::deque<entry> entries_;
+    // The entries stand one behind the other, the first at first_.
+    std::vector<std::uint8_t> bytes_;
+    std::size_t first_ = 0;
+    std::deque<std::size_t> sizes_;
 };
 
 }  // namespace platform::simulated

@@ -63,7 +63,7 @@ void event_stream::end_after(std::chrono::microseconds duration) {
 }
 
 void event_stream::mark_end() {
-    add(entry(event_record_size, 0));
+    add(event_record{});
     ended_ = true;
     end_at_.reset();
 }
@@ -98,7 +98,7 @@ void event_stream::happen(std::uint64_t event) {
     const event_kind& kind = *from.kinds[turn % from.kinds.size()];
     for (const event_record& record :
          make_event(kind, from.component, event, time_of(event), sequence_num_)) {
-        if (size() < capacity) add(entry(record.begin(), record.end()));
+        if (size() < capacity) add(record);
         recent_.push_back(record);
         if (recent_.size() > recent_records) recent_.pop_front();
     }
