@@ -87,7 +87,8 @@ TEST_F(record_body, of_sensor_information) {
     EXPECT_EQ(decoded_body(record), " 'name':  'zzzzzzzzzzzz'" + numbers);
     EXPECT_EQ(decoded_body(with_text(record, 35, {"gyro\0", 5})),
               " 'name':          'gyro'" + numbers);
-    EXPECT_EQ(decoded_body(with_text(record, 35, {"", 1})), " 'name':              ''" + numbers);
+    EXPECT_EQ(decoded_body(with_text(record, 35, std::string(1, '\0'))),
+              " 'name':              ''" + numbers);
 }
 
 TEST_F(record_body, of_an_external_function) {
