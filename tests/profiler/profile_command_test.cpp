@@ -286,6 +286,44 @@ TEST_F(profile_command, get_logs_decodes_for_humans_and_refuses_other_words) {
     EXPECT_TRUE(happened().empty());
 }
 
+TEST_F(profile_command, get_logs_reads_what_there_is_of_the_two_halves) {
+    put_driver();
+    driver->answers[9] = {{.bytes = record_bytes(3, 1)}, {}};
+    const outcome no_service = profile({"get-logs"});
+    EXPECT_EQ(no_service.out, dumped(3, 1) + "\n\n");
+    EXPECT_EQ(no_service.err, failed("base/channel.cpp", "service") +
+                                  failed("base/profile_records.cpp", "result == 0 ",
+                                         "service not found (0xe00002f0)"));
+    host.remove(driver_name);
+    put_profile_service();
+    const outcome no_driver = profile({"get-logs", "fwdump", "errdump"});
+    EXPECT_EQ(no_driver.out, "\n\nerrdump\n\n\n");
+    EXPECT_EQ(no_driver.err, "");
+}
+
+TEST_F(profile_command, subcommands_take_their_own_words_and_no_other) {
+    put_both_halves();
+    driver->queue->add(record_bytes(0, 0));
+    struct row {
+        std::vector<std::string> words;
+        int taken;
+    };
+    const std::vector<row> rows{
+        {{"help", "x"}, 0},
+        {{"enable", "x"}, 0},
+        {{"on-error", "panic", "x"}, 1},
+        {{"on-error", "Panic", "x"}, 1},
+        {{"monitor", "auto", "human"}, 1},
+        {{"get-logs", "fwdump", "bad", "errdump"}, 2},
+        {{"config", "sensor:accel", "bad", "sensor:gyro"}, 2},
+        {{"config", "sensor:accel", "sensor:gyro"}, 2},
+    };
+    for (const row& one : rows) {
+        profile(one.words);
+        EXPECT_EQ(taken, one.taken) << ::testing::PrintToString(one.words);
+    }
+}
+
 TEST_F(profile_command, on_error_refuses_other_words_and_a_missing_one) {
     put_both_halves();
     EXPECT_EQ(profile({"on-error", "Panic"}).out, "invalid argument: Panic\n");
@@ -343,6 +381,36 @@ TEST_F(profile_command, run_stops_at_the_first_failure) {
     EXPECT_EQ(logged("call").size(), 5U);
 }
 
+TEST_F(profile_command, run_disables_nothing_after_a_failure_of_its_own) {
+    const std::string enable_call =
+        "call KeltoNRXProfileDriver 0 scalars [0x1] in [] results 0 room 0";
+    const std::string disable_call =
+        "call KeltoNRXProfileDriver 0 scalars [0x0] in [] results 0 room 0";
+    const auto times = [&](const std::string& call) {
+        const auto calls = logged("call");
+        return std::count(calls.begin(), calls.end(), call);
+    };
+    put_both_halves();
+    driver->answers[0] = {{.code = platform::unsupported}};
+    EXPECT_EQ(profile({"auto"}).err,
+              failed(kernel, "kr == 0 ", unsupported_text) + failed(monitor_file, "success"));
+    EXPECT_EQ(times(enable_call), 1);
+    driver->answers[0] = {};
+    driver->queue->add(byte_list(49, 3));  // no room for it in a record
+    EXPECT_TRUE(profile({"auto"}).err.ends_with(failed(monitor_file, "success")));
+    EXPECT_EQ(times(enable_call), 2);
+    EXPECT_EQ(times(disable_call), 0);
+    // What puts everything back may fail, and goes on all the same.
+    driver->queue->clear();
+    driver->queue->add(record_bytes(0, 0));
+    driver->answers[2] = {{}, {.code = platform::no_memory}};
+    const outcome refused = profile({"auto"});
+    EXPECT_TRUE(refused.out.ends_with("done\n"));
+    EXPECT_EQ(refused.err,
+              failed("profiler/apply_configs.cpp", "result == 0 ", "out of memory (0xe00002bd)"));
+    EXPECT_EQ(times(disable_call), 1);
+}
+
 TEST_F(profile_command, interrupt_during_any_subcommand_asks_for_the_end_of_the_stream) {
     put_both_halves();
     driver->actions[0] = [] { std::raise(SIGINT); };
@@ -352,6 +420,32 @@ TEST_F(profile_command, interrupt_during_any_subcommand_asks_for_the_end_of_the_
                      "call KeltoNRXProfileDriver 11 scalars [] in [] results 0 room 0"}));
     driver->answers[11] = {{.code = platform::unsupported}};
     EXPECT_EQ(profile({"enable"}).err, failed(kernel, "kr == 0 ", unsupported_text));
+}
+
+TEST_F(profile_command, interrupt_at_the_first_call_of_each_subcommand_is_served_once) {
+    put_both_halves();
+    const std::string stop_call = "call KeltoNRXProfileDriver 11 scalars [] in [] results 0 room 0";
+    const std::vector<std::vector<std::string>> subcommands{
+        {"clear-eventsources"},
+        {"eventsources"},
+        {"wqrfw-wakestats"},
+        {"enable"},
+        {"disable"},
+        {"stop"},
+        {"flush"},
+        {"get-config"},
+        {"config", "sensor:accel"},
+        {"signal-errdump"},
+        {"get-logs"},
+        {"on-error", "panic"},
+    };
+    std::ptrdiff_t served = 0;
+    for (const auto& words : subcommands) {
+        host.before_call(1, [] { std::raise(SIGINT); });
+        profile(words);
+        const auto calls = logged("call");
+        EXPECT_EQ(std::count(calls.begin(), calls.end(), stop_call), ++served) << words[0];
+    }
 }
 
 }  // namespace tests

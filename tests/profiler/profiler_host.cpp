@@ -96,7 +96,9 @@ outcome profiler_test::profile(std::vector<std::string> words) {
     for (std::string& word : words)
         argv.push_back(word.data());
     int index = 1;
-    return capture([&] { nrx::profile_command(words[0], argv, index); });
+    outcome written = capture([&] { nrx::profile_command(words[0], argv, index); });
+    taken = index - 1;
+    return written;
 }
 
 std::string failed(std::string_view file, std::string_view condition, std::string_view code) {

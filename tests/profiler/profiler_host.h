@@ -66,8 +66,9 @@ protected:
     // and released.
     std::vector<std::string> happened();
 
-    // Runs a subcommand as the command line gives it.
+    // Runs a subcommand as the command line gives it; taken is then how many further words it took.
     outcome profile(std::vector<std::string> words);
+    int taken = 0;
 
     scripted_driver* driver = nullptr;
     interface_driver* service = nullptr;
