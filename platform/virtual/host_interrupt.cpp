@@ -2,13 +2,9 @@
 
 #include <algorithm>
 #include <atomic>
-#include <cerrno>
 #include <csignal>
-#include <cstdint>
 #include <ctime>
 #include <poll.h>
-#include <sys/eventfd.h>
-#include <unistd.h>
 
 #include "platform/interrupt.h"
 #include "platform/virtual/interrupts.h"
@@ -23,17 +19,8 @@ static_assert(std::atomic<bool>::is_always_lock_free);
 interrupt_handler registered = nullptr;
 bool serving = false;
 
-// Readable once an interrupt was noted. Made at the first use and kept: a signal handler may be
-// writing to it at any time.
-int wake_descriptor = -1;
-
-// The note comes before the wake: whoever was woken finds it.
 extern "C" void note_interrupt(int /*signal*/) {
-    const int saved_errno = errno;
     noted = true;
-    const std::uint64_t one = 1;
-    [[maybe_unused]] const ssize_t written = ::write(wake_descriptor, &one, sizeof(one));
-    errno = saved_errno;
 }
 
 void set_action(void (*action)(int)) {
@@ -51,7 +38,6 @@ timespec as_timespec(std::chrono::nanoseconds duration) {
 }  // namespace
 
 void handle_interrupt(interrupt_handler handler) {
-    if (wake_descriptor < 0) wake_descriptor = ::eventfd(0, EFD_NONBLOCK | EFD_CLOEXEC);
     registered = handler;
     set_action(note_interrupt);
 }
@@ -72,14 +58,20 @@ void serve_interrupt() {
     serving = false;
 }
 
-// An interrupt that comes in before ppoll begins has made the descriptor readable: none is missed.
+// The signal is held back while it is decided whether to block, and let in by ppoll together with
+// the wait: none can slip in between.
 void await_interrupt(std::optional<std::chrono::nanoseconds> timeout) {
-    pollfd woken{.fd = wake_descriptor, .events = POLLIN, .revents = 0};
-    timespec left{};
-    if (timeout) left = as_timespec(std::max(*timeout, std::chrono::nanoseconds(0)));
-    if (::ppoll(&woken, 1, timeout ? &left : nullptr, nullptr) <= 0) return;
-    std::uint64_t count = 0;
-    [[maybe_unused]] const ssize_t got = ::read(wake_descriptor, &count, sizeof(count));
+    sigset_t held_back{};
+    sigset_t usual{};
+    ::sigemptyset(&held_back);
+    ::sigaddset(&held_back, SIGINT);
+    ::pthread_sigmask(SIG_BLOCK, &held_back, &usual);
+    if (!noted) {
+        timespec left{};
+        if (timeout) left = as_timespec(std::max(*timeout, std::chrono::nanoseconds(0)));
+        ::ppoll(nullptr, 0, timeout ? &left : nullptr, &usual);
+    }
+    ::pthread_sigmask(SIG_SETMASK, &usual, nullptr);
 }
 
 }  // namespace simulated

@@ -10,8 +10,8 @@ namespace platform::simulated {
 // call ends with this.
 void serve_interrupt();
 
-// Blocks for that long, or without end, or until an interrupt is noted; at once if one was noted
-// since the last time. It may return early for an interrupt that was served in between.
+// Blocks for that long, or without end, or until an interrupt is noted; not at all if one that was
+// noted is not served yet.
 void await_interrupt(std::optional<std::chrono::nanoseconds> timeout);
 
 }  // namespace platform::simulated

@@ -7,6 +7,7 @@
 #include <thread>
 
 #include "platform/clock.h"
+#include "platform/virtual/interrupts.h"
 #include "tests/platform/queue_host.h"
 
 namespace tests {
@@ -100,6 +101,19 @@ TEST_F(interrupt, before_a_wait_is_not_missed_by_it) {
     host.before_call(1, [] { std::raise(SIGINT); });
     EXPECT_EQ(platform::wait_for_data(queue, port), platform::success);
     EXPECT_EQ(handled, 1);
+}
+
+TEST_F(interrupt, that_is_not_served_yet_lets_nothing_block) {
+    host.clock().follow_host();
+    std::raise(SIGINT);
+    platform::simulated::await_interrupt(std::nullopt);
+    EXPECT_EQ(handled, 0);
+    platform::simulated::serve_interrupt();
+    platform::simulated::await_interrupt(1ms);
+    EXPECT_EQ(handled, 1);
+    sigset_t held_back{};
+    ::pthread_sigmask(SIG_SETMASK, nullptr, &held_back);
+    EXPECT_FALSE(::sigismember(&held_back, SIGINT));
 }
 
 TEST_F(interrupt, inside_a_sleep_is_handled_at_once_and_the_sleep_goes_on) {
