@@ -33,8 +33,9 @@ monitor_args parse_monitor_args(argument_words& words);
 bool monitor_profiler(std::uint32_t duration, record_printer print);
 
 // Prints the entries that the queue holds, up to the end marker, which sets ended and is not
-// printed. What an entry lacks of a record reads as 0 and is a failure report. Success, or the code
-// of an entry that could not be taken, with a failure report.
+// printed. What an entry lacks of a record reads as 0 and is a failure report; so one without any
+// byte is an end marker. Success, or the code of an entry that could not be taken, with a failure
+// report.
 platform::return_code drain_profile_queue(const platform::mapped_memory& queue, bool& ended,
                                           record_printer print);
 

@@ -24,7 +24,7 @@ bool profiler_conn::open_queue(presence mapping) {
     const bool success = open(presence::is_required);
     if (!check(success, "success")) return false;
     platform::return_code kr = platform::map_memory(connection_, event_queue_memory, queue_);
-    if (kr != platform::success && mapping == presence::is_optional) return false;
+    if (!queue_ && mapping == presence::is_optional) return false;
     if (!check_success(kr, "kr == 0 ")) return false;
     if (!check(queue_, "queue")) return false;
     port_ = platform::allocate_port();

@@ -41,7 +41,7 @@ public:
 
     // Opens, maps the driver's event queue and attaches a port that is signalled when events
     // arrive. Whether all of it stands; if not, the check that failed is reported, but for a
-    // mapping that fails and is optional.
+    // mapping that is optional and fails or, reported as a success, hands over no memory.
     bool open_queue(presence mapping);
 
     // None before a successful open_queue.

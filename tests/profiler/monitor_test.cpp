@@ -1,5 +1,6 @@
 #include "nrxctl/profiler/monitor.h"
 
+#include <algorithm>
 #include <csignal>
 
 #include "nrxctl/base/tick_period.h"
@@ -23,6 +24,7 @@ constexpr const char* io_text = "device i/o failure (0xe0000401)";
 constexpr const char* unsupported_text = "unsupported request (0xe00002c7)";
 
 const byte_list marker = record_bytes(0, 0);
+const std::string stop_call = "call KeltoNRXProfileDriver 11 scalars [] in [] results 0 room 0";
 
 // What the coprocessor's log holds, at most once.
 std::string log_line() {
@@ -256,18 +258,24 @@ TEST_F(monitor, interrupt_asks_for_the_end_of_the_stream) {
 
 TEST_F(monitor, interrupt_at_any_platform_call_ends_it_in_good_order) {
     end_on_stop();
-    driver->queue->add(record_bytes(3, 1));
-    std::size_t calls = 0;  // up to the wait
-    host.clock().plan(10ms, [&] {
-        calls = host.calls_made();
-        std::raise(SIGINT);
-    });
-    watch();
-    for (std::size_t call = 1; call <= calls; ++call) {
+    const auto stream_a_record = [&] {
         driver->queue->clear();
         driver->queue->add(record_bytes(3, 1));
+        host.clock().plan(host.clock().now() + 10ms, [this] { driver->queue->add(marker); });
+    };
+    stream_a_record();
+    const std::size_t calls_before = host.calls_made();
+    watch();
+    const std::size_t calls = host.calls_made() - calls_before;
+    for (std::size_t call = 1; call <= calls; ++call) {
+        stream_a_record();
+        const auto stops = [&] {
+            return std::count(host.log().begin(), host.log().end(), stop_call);
+        };
+        const auto stops_before = stops();
         host.before_call(call, [] { std::raise(SIGINT); });
         EXPECT_EQ(watch(), (run{true, dumped(3, 1) + log_line() + "done\n", ""})) << call;
+        EXPECT_EQ(stops(), stops_before + 1) << call;
     }
 }
 

@@ -80,7 +80,9 @@ TEST_F(profiler_operations, connection_reports_what_is_missing_unless_it_is_opti
     EXPECT_EQ(opening_queue(presence::is_required).err, failed(conn, "kr == 0 ", unsupported_text));
     EXPECT_EQ(opening_queue(presence::is_optional).err, "");
     host.fail_call(3, failure::nothing);
-    EXPECT_EQ(opening_queue(presence::is_optional).err, failed(conn, "queue"));
+    EXPECT_EQ(opening_queue(presence::is_required).err, failed(conn, "queue"));
+    host.fail_call(3, failure::nothing);
+    EXPECT_EQ(opening_queue(presence::is_optional).err, "");
     driver->queue = std::make_shared<platform::simulated::shared_queue>();
     host.fail_call(4, failure::no_memory);
     EXPECT_EQ(opening_queue(presence::is_optional).err, failed(conn, "rxPort"));

@@ -2,6 +2,9 @@
 
 #include <csignal>
 
+#include "nrxctl/base/tick_period.h"
+#include "platform/clock.h"
+#include "platform/virtual/profiler/profiler.h"
 #include "tests/profiler/profiler_host.h"
 
 namespace tests {
@@ -354,6 +357,17 @@ TEST_F(profile_command, run_configures_enables_monitors_and_puts_everything_back
                "call profile 3 scalars [0x24] in [" + test_off + "] results 0 room 0",
                "call KeltoNRXProfileDriver 2 scalars [] in [" + test_off + "] results 0 room 0",
                "call KeltoNRXProfileDriver 0 scalars [0x0] in [] results 0 room 0"}));
+}
+
+TEST_F(profile_command, run_leaves_nothing_active_on_a_device_that_takes_what_it_is_told) {
+    nrx::tick_period = platform::tick_period();
+    serve_profile(put_service(host, "profile", 0x50),
+                  platform::simulated::add_profiler_driver(host));
+    EXPECT_NE(profile({"40", "sensor:accel:data"}).out.find("prof-event 02020002"),
+              std::string::npos);
+    EXPECT_EQ(profile({"get-config"}).out,
+              "No client is connected\n\nActive components in kext:\n    none\n\nActive components "
+              "in fw:\n    none\n");
 }
 
 TEST_F(profile_command, run_stops_at_the_first_failure) {

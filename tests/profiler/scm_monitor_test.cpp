@@ -1,6 +1,8 @@
 #include "nrxctl/profiler/scm_monitor.h"
 
 #include <algorithm>
+#include <chrono>
+#include <csignal>
 #include <utility>
 
 #include "nrxctl/base/tick_period.h"
@@ -31,6 +33,8 @@ const std::string disable_call =
 const std::string status_call = "call KeltoNRXProfileDriver 1 scalars [] in [] results 1 room 0";
 const std::string duration_call = "call profile 1 scalars [0xd2] in [10 27 00 00] results 0 room 0";
 const std::string log_call = "call profile 2 scalars [0xd1] in [] results 0 room 65536";
+const std::string interrupt_call =
+    "call KeltoNRXProfileDriver 11 scalars [] in [] results 0 room 0";
 const std::string stop_call = config("00", "02", "ff ff ff ff");
 const std::string start_call = config("02", "00", "80 00 00 00");
 
@@ -111,6 +115,38 @@ TEST_F(scm_monitor, disables_what_it_enabled_after_every_failure) {
     EXPECT_TRUE(unmapped.err.ends_with(failed("profiler/monitor.cpp", "success") +
                                        failed(scm_file, "success")));
     EXPECT_EQ(logged("call").back(), disable_call);
+}
+
+TEST_F(scm_monitor, goes_on_if_the_driver_will_not_enable_but_not_if_it_tells_no_status) {
+    put_both_halves();
+    stream_a_transfer();
+    driver->answers[0] = {{.code = platform::simulated::io_failure}};
+    const std::string refused = failed(kernel, "kr == 0 ", "device i/o failure (0xe0000401)");
+    const outcome not_enabled = monitor("10", {"scm:smb1:ch7"});
+    EXPECT_EQ(not_enabled.out, "smb1.7: scm_write wqr_timestamp=100 scm_timestamp=5000\ndone\n");
+    EXPECT_EQ(not_enabled.err, refused + refused);
+    happened();
+
+    driver->answers[1] = {{.code = platform::simulated::io_failure}};
+    const outcome no_status = monitor("10", {"scm:smb1:ch7"});
+    EXPECT_EQ(no_status.out, "");
+    EXPECT_EQ(no_status.err, refused + failed(scm_file, "success"));
+    EXPECT_EQ(happened(), (lines{"open KeltoNRXProfileDriver type 0", status_call,
+                                 "close KeltoNRXProfileDriver"}));
+    EXPECT_TRUE(has_default_action());
+}
+
+TEST_F(scm_monitor, interrupted_in_its_wait_it_stops_the_stream_and_puts_everything_back) {
+    put_both_halves();
+    driver->actions[11] = [this] { driver->queue->add(record_bytes(0, 0)); };
+    host.clock().plan(std::chrono::milliseconds(30), [] { std::raise(SIGINT); });
+    const outcome written = monitor("auto", {"scm:smb1:ch7"});
+    EXPECT_EQ(written.out, "done\n");
+    EXPECT_EQ(written.err, "");
+    const lines calls = logged("call");
+    ASSERT_EQ(calls.size(), 8U);
+    EXPECT_EQ(lines(calls.begin() + 4, calls.end()),
+              (lines{interrupt_call, log_call, stop_call, disable_call}));
 }
 
 TEST_F(scm_monitor, ends_early_without_profiler_status_duration_or_configurations) {
