@@ -9,7 +9,7 @@
 #include "fuzz/support/harness.h"
 #include "nrxctl/printers/button_stats.h"
 #include "nrxctl/printers/haptic_assets.h"
-#include "nrxctl/printers/report_printers.h"
+#include "nrxctl/printers/printer_registry.h"
 #include "nrxctl/printers/spi_status.h"
 #include "nrxctl/printers/value_printers.h"
 

@@ -1,7 +1,7 @@
 // The front end's own checks: those of the library under the front end's label.
 #pragma once
 
-#include "nrxctl/base/failure_report.h"
+#include "nrxctl/nrxtoollib.h"
 
 namespace nrx::keyprobe {
 

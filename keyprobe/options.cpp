@@ -33,6 +33,8 @@ int run(int argc, char** argv) {
     ::unsetenv("POSIXLY_CORRECT");  // would end the parsing at the first word that is no option
     optind = 0;  // the parser starts afresh, also when this is not the first run in the process
     while (true) {
+        // The letters are known to the parser and refused here like any other option: only
+        // unknown ones get a message of the parser's own before the usage line.
         const int option = getopt_long(argc, argv, "bf:", long_options.data(), nullptr);
         if (option == -1) return EXIT_SUCCESS;
         if (option != collect_all_option) print_usage(argv[0]);

@@ -40,4 +40,11 @@ std::int64_t parse_number(std::string_view word, std::string_view message) {
     return negative ? -*value : *value;
 }
 
+std::uint32_t parse_number_up_to(std::uint32_t largest, std::string_view word,
+                                 std::string_view message) {
+    const std::int64_t number = parse_number(word, message);
+    if (number < 0 || number > largest) refuse_word(message, word);
+    return static_cast<std::uint32_t>(number);
+}
+
 }  // namespace nrx

@@ -3,7 +3,6 @@
 #include <array>
 #include <cstddef>
 #include <limits>
-#include <optional>
 #include <string_view>
 
 #include "nrxctl/base/end_process.h"
@@ -12,6 +11,7 @@
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/refuse_word.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/word_table.h"
 
 namespace nrx {
 
@@ -23,13 +23,6 @@ struct width_word {
 };
 
 constexpr std::array width_words{width_word{"u8", 1}, width_word{"u16", 2}, width_word{"u32", 4}};
-
-std::optional<std::size_t> width_named(std::string_view word) {
-    for (const width_word& known : width_words) {
-        if (known.word == word) return known.bytes;
-    }
-    return std::nullopt;
-}
 
 // A payload value: signed 32 bits, hexadecimal unless it has the decimal prefix.
 std::int32_t parse_value(std::string_view word) {
@@ -55,8 +48,8 @@ void check_width(std::int64_t value, std::uint64_t largest) {
     if (widened <= largest) return;
     text_line line;
     line.text("Value ").number(value).text(" (0").hex(widened).text(") is bigger than allowed (");
-    line.number(largest).text(", 0x").hex(largest).text(")\n");
-    write_output(line.view());
+    line.number(largest).text(", 0x").hex(largest).text(")");
+    print_line(line.view());
     end_process();
 }
 
@@ -70,9 +63,9 @@ void parse_payload(std::span<char* const> words, int& position,
     const auto word_at = [&](int index) {
         return std::string_view(words[static_cast<std::size_t>(index)]);
     };
-    const auto named = width_named(word_at(position));
-    if (named) ++position;
-    const std::size_t width = named.value_or(1);
+    const width_word* named = find_word_row(width_words, word_at(position));
+    if (named != nullptr) ++position;
+    const std::size_t width = named == nullptr ? 1 : named->bytes;
     const std::uint64_t largest = (std::uint64_t{1} << (8 * width)) - 1;
     for (; position < count && !word_at(position).starts_with('-'); ++position) {
         const std::int64_t value = parse_value(word_at(position));

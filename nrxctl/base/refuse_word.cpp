@@ -7,7 +7,7 @@
 namespace nrx {
 
 void refuse_word(std::string_view message, std::string_view word) {
-    write_output(text_line().text(message).text(" (").text(word).text(")\n").view());
+    print_line(text_line().text(message).text(" (").text(word).text(")").view());
     end_process();
 }
 

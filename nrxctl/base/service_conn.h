@@ -23,7 +23,7 @@ public:
 
     // Finds the service by its bare registry name, of whatever class, takes its first child and
     // opens a connection of type 0 on that. Whether the connection is open; if not, the check that
-    // failed is reported, but for a missing service when quiet.
+    // failed is reported, except that a missing service is not when quiet.
     bool open(bool quiet);
 
     // The connection; none before a successful open.

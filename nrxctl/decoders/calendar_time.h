@@ -12,8 +12,8 @@ namespace nrx {
 // coprocessor's time, by the sync point that the driver's time-sync service has published last. The
 // registry is asked anew at every call; only the local time of the last second is kept, for as long
 // as the time zone stays the same. Months are named as in the C locale. None, and nothing is
-// reported, if there is no such service or it publishes no sync point; one without both numbers is
-// none.
+// reported, if there is no such service or it publishes no sync point; a sync point that lacks a
+// number counts as missing.
 std::optional<short_text> calendar_time(std::uint64_t timestamp);
 
 }  // namespace nrx

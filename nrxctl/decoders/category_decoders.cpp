@@ -1,6 +1,6 @@
 #include "nrxctl/decoders/category_decoders.h"
 
-#include "nrxctl/decoders/name_tables.h"
+#include "nrxctl/decoders/event_names.h"
 
 namespace nrx {
 

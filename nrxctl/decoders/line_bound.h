@@ -7,7 +7,7 @@
 #include <span>
 #include <string_view>
 
-#include "nrxctl/decoders/name_tables.h"
+#include "nrxctl/decoders/event_names.h"
 #include "nrxctl/decoders/record_layout.h"
 
 namespace nrx {

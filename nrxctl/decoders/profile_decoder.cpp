@@ -4,7 +4,7 @@
 
 #include "nrxctl/decoders/boot_time.h"
 #include "nrxctl/decoders/calendar_time.h"
-#include "nrxctl/decoders/name_tables.h"
+#include "nrxctl/decoders/event_names.h"
 #include "nrxctl/decoders/record_fields.h"
 #include "nrxctl/decoders/record_layout.h"
 

@@ -57,7 +57,8 @@ char* put_digits(char* to, std::uint64_t value, std::size_t count);
 // A number in decimal.
 char* put_number(char* to, std::uint64_t value, std::size_t width);
 
-// A number in lower-case hexadecimal and in single quotes; the width is that of the opening quote.
+// A number in lower-case hexadecimal and in single quotes; only the opening quote is padded to
+// the width.
 char* put_quoted_hex(char* to, std::uint32_t value, std::size_t width);
 
 // A fraction as printf's %g writes it, with six significant digits.

@@ -2,22 +2,14 @@
 
 #include <algorithm>
 #include <cstdint>
-#include <string_view>
 
+#include "nrxctl/base/field_text.h"
+#include "nrxctl/base/fixed_point.h"
 #include "nrxctl/base/little_endian.h"
 
 namespace nrx {
 
 namespace {
-
-constexpr double one_with_16_fraction_bits = 65536.0;
-constexpr double one_with_12_fraction_bits = 4096.0;
-
-std::string_view text_at(const profile_record& record, const record_row& row) {
-    const auto* first = record.bytes.data() + row.offset;
-    const auto* last = std::find(first, first + row.extent, 0);
-    return {reinterpret_cast<const char*>(first), static_cast<std::size_t>(last - first)};
-}
 
 char* put_value(char* to, const profile_record& record, const record_row& row) {
     const std::uint8_t* source = record.bytes.data() + row.offset;
@@ -33,15 +25,13 @@ char* put_value(char* to, const profile_record& record, const record_row& row) {
         case row_kind::hex_u32:
             return put_quoted_hex(to, load_le<std::uint32_t>(source), row.width);
         case row_kind::fraction_16:
-            return put_fraction(to, load_le<std::int32_t>(source) / one_with_16_fraction_bits,
-                                row.width);
+            return put_fraction(to, load_le<std::int32_t>(source) / fixed_point_one, row.width);
         case row_kind::fraction_12:
-            return put_fraction(to, load_le<std::int32_t>(source) / one_with_12_fraction_bits,
-                                row.width);
+            return put_fraction(to, load_le<std::int32_t>(source) / fixed_point_one_12, row.width);
         case row_kind::constant:
             return put_number(to, row.extent, row.width);
         case row_kind::text:
-            return put_quoted(to, text_at(record, row), row.width);
+            return put_quoted(to, text_before_nul({source, row.extent}), row.width);
         case row_kind::byte_list:
             return put_list(to, {source, row.extent}, row.width);
         case row_kind::counted_list: {

@@ -56,7 +56,7 @@ void scm_packet_printer::print_transfer(const profile_record& record) {
     text_line line;
     line.text(label_).text(": ").text(direction_names[direction]).text(" wqr_timestamp=");
     line.number(static_cast<std::int64_t>(last_transfer_)).text(" scm_timestamp=").number(bus_time);
-    write_output(line.text("\n").view());
+    print_line(line.view());
 }
 
 void print_scm_packet(const profile_record& record) {

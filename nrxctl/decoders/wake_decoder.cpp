@@ -1,6 +1,6 @@
 #include "nrxctl/decoders/wake_decoder.h"
 
-#include "nrxctl/decoders/name_tables.h"
+#include "nrxctl/decoders/event_names.h"
 #include "nrxctl/decoders/record_fields.h"
 #include "nrxctl/decoders/record_layout.h"
 

@@ -68,7 +68,7 @@ void print_data_log(platform::byte_view report) {
         const reply_fields fields(report);
         line.clear();
         line.text("data:").hex(fields.u32(8), 2).text(" timestamp:").number(fields.u64(0));
-        write_output(line.text("\n").view());
+        print_line(line.view());
     }
 }
 

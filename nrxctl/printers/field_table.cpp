@@ -65,7 +65,7 @@ void print_fields(const field_table& table, platform::byte_view report, source_p
             append_value(line, row, fields);
             line.text(row.unit);
         }
-        write_output(line.text("\n").view());
+        print_line(line.view());
     }
 }
 

@@ -6,7 +6,7 @@
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
-#include "nrxctl/printers/name_tables.h"
+#include "nrxctl/printers/haptic_names.h"
 
 namespace nrx {
 
@@ -34,8 +34,8 @@ void print_asset(const reply_fields& fields, std::int32_t speed, std::int32_t ev
     line.text(", slot ").number(fields.s32(entry + slot_offset));
     line.text(", gain ").general(fields.s32(entry + gain_offset) / fixed_point_one);
     line.text(", min ").number(fields.u64(entry + min_offset));
-    line.text(", max ").number(fields.u64(entry + max_offset)).text("\n");
-    write_output(line.view());
+    line.text(", max ").number(fields.u64(entry + max_offset));
+    print_line(line.view());
 }
 
 }  // namespace
@@ -44,8 +44,8 @@ void print_haptic_assets(std::string_view /*service_name*/, std::int32_t /*repor
                          platform::byte_view report) {
     if (report.empty()) return;
     text_line line;
-    line.text("Length: ").number(report.size()).text(", expected ").number(table_size).text("\n");
-    write_output(line.view());
+    line.text("Length: ").number(report.size()).text(", expected ").number(table_size);
+    print_line(line.view());
     const reply_fields fields(report);
     for (std::int32_t speed = 0; speed < speeds; ++speed) {
         for (std::int32_t event = 0; event < events; ++event)

@@ -6,9 +6,8 @@
 namespace nrx {
 
 // Prints the report's length beside the expected one, then one line per speed and button event;
-// gains are fractions. An
-// empty report prints nothing. Entries beyond a short report print as zeros; bytes beyond the table
-// are not read: the length line is the only sign of either.
+// gains are fractions. An empty report prints nothing. Entries beyond a short report print as
+// zeros; bytes beyond the table are not read: the length line is the only sign of either.
 void print_haptic_assets(std::string_view service_name, std::int32_t report_id,
                          platform::byte_view report);
 

@@ -32,12 +32,12 @@ void append_signed(text_line& line, double value) {
 void print_ranges(platform::byte_view report) {
     check_length(report, record_size);
     const reply_fields fields(report);
-    write_output(text_line().text("num_samples: ").number(fields.s32(0)).text("\n").view());
+    print_line(text_line().text("num_samples: ").number(fields.s32(0)).view());
     for (const axis& one : axes) {
         text_line line;
         append_signed(line.text(one.label), fields.s32(one.lowest) / fixed_point_one);
         append_signed(line.text(" - "), fields.s32(one.highest) / fixed_point_one);
-        write_output(line.text("\n").view());
+        print_line(line.view());
     }
 }
 

@@ -65,14 +65,14 @@ void print_status(const reply_fields& fields) {
     text_line line = heading_of(fields);
     line.text("STATUS: errorCode(0x").hex(code).text("), ");
     append_error(line, code, fields.u32(13));
-    write_output(line.text("\n").view());
+    print_line(line.view());
 }
 
 void print_captured(platform::byte_view record, std::uint8_t type) {
     for (const captured_data& known : captured_types) {
         if (known.type != type) continue;
         text_line line = heading_of(reply_fields(record));
-        write_output(line.text(known.heading).text(": \n").view());
+        print_line(line.text(known.heading).text(": ").view());
         hex_dump(record.subspan(header_size));
     }
 }

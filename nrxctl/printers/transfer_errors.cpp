@@ -1,9 +1,8 @@
 #include "nrxctl/printers/transfer_errors.h"
 
-#include <algorithm>
 #include <cstddef>
-#include <string>
 
+#include "nrxctl/base/field_text.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
@@ -17,19 +16,14 @@ constexpr std::size_t name_offset = 24;
 constexpr std::size_t longest_name = 7;
 constexpr std::size_t name_width = 15;
 
-std::string record_name(platform::byte_view record) {
-    const auto field = record.subspan(name_offset, longest_name);
-    return {field.begin(), std::find(field.begin(), field.end(), 0)};
-}
-
 void print_record(platform::byte_view record) {
     const reply_fields fields(record);
     text_line line;
-    line.left(record_name(record), name_width);
+    line.left(text_before_nul(record.subspan(name_offset, longest_name)), name_width);
     line.text(" read_errors: ").number(fields.s32(4)).text("/").number(fields.s32(0));
     line.text(" write_errors: ").number(fields.s32(12)).text("/").number(fields.s32(8));
     line.text(" other_errors: ").number(fields.s32(20)).text("/").number(fields.s32(16));
-    write_output(line.text("\n").view());
+    print_line(line.view());
 }
 
 }  // namespace

@@ -49,7 +49,7 @@ void print_u32(std::string_view /*service_name*/, std::int32_t /*report_id*/,
     std::array<std::uint8_t, 4> word{};
     if (report.size() > word.size()) return;
     std::copy(report.begin(), report.end(), word.begin());
-    write_output(text_line().number(load_le<std::uint32_t>(word.data())).text("\n").view());
+    print_line(text_line().number(load_le<std::uint32_t>(word.data())).view());
 }
 
 }  // namespace nrx

@@ -5,7 +5,6 @@
 
 #include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/numbers.h"
-#include "nrxctl/base/refuse_word.h"
 #include "nrxctl/profiler/split.h"
 
 namespace nrx {
@@ -19,11 +18,7 @@ constexpr std::string_view all_word = "all";
 
 // A word as its number; it must fit into 32 bits without a sign.
 std::uint32_t parse_u32(std::string_view word, std::string_view message) {
-    const std::int64_t number = parse_number(word, message);
-    if (number < 0 || number > std::numeric_limits<std::uint32_t>::max()) {
-        refuse_word(message, word);
-    }
-    return static_cast<std::uint32_t>(number);
+    return parse_number_up_to(std::numeric_limits<std::uint32_t>::max(), word, message);
 }
 
 // The list in a field; a field that is not there is "all".

@@ -48,6 +48,7 @@ void print_profiler_config(const profiler_config& config) {
     constexpr std::size_t name_width = 10;
     text_line line;
     line.text("    profiler ").left(profiler_name_or_number(config.profiler).view(), name_width);
+    // "stopd" is what this line has always said.
     line.text(" is ").text(state_word(config.state)).text("d [component=");
     if (config.state != profiler_state::stop) {
         line.text(component_name_or_number(config.profiler, config.component).view());

@@ -1,7 +1,8 @@
 #include "nrxctl/profiler/config_words.h"
 
-#include <algorithm>
 #include <array>
+
+#include "nrxctl/base/word_table.h"
 
 namespace nrx {
 
@@ -150,27 +151,19 @@ constexpr std::array profilers{
                      .reports = &wake_reports},
 };
 
-// The row of a table whose word it is; null if there is none.
-template <class Table>
-auto find_row(const Table& table, std::string_view word) -> decltype(table.data()) {
-    const auto found =
-        std::find_if(table.begin(), table.end(), [&](const auto& row) { return row.word == word; });
-    return found == table.end() ? nullptr : &*found;
-}
-
 }  // namespace
 
 const profiler_grammar* find_profiler_grammar(std::string_view word) {
-    return find_row(profilers, word);
+    return find_word_row(profilers, word);
 }
 
 const report_grammar* reports_of(const profiler_grammar& profiler, std::string_view component) {
-    const component_reports* special = find_row(profiler.special_reports, component);
+    const component_reports* special = find_word_row(profiler.special_reports, component);
     return special == nullptr ? profiler.reports : &special->reports;
 }
 
 const word_number* find_word(std::span<const word_number> table, std::string_view word) {
-    return find_row(table, word);
+    return find_word_row(table, word);
 }
 
 }  // namespace nrx

@@ -16,7 +16,7 @@ namespace nrx {
 bool fw_profiler_available();
 
 // Sends configurations. Success, and nothing sent, if there is no profiler; else the code of the
-// command, without a report of its own.
+// command; a command that is refused is not reported.
 platform::return_code send_fw_configs(std::span<const profiler_config> configs);
 
 // The active configurations; none if they cannot be read.

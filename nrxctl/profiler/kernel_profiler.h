@@ -21,7 +21,11 @@ bool get_profiler_status(bool& connected);
 // The active configurations, read on an open connection; none if they cannot be read.
 std::vector<profiler_config> read_kernel_configs(const profiler_conn& conn);
 
-enum class stored_records : std::uint32_t { error_dump = 8, log = 9 };
+// What the driver has stored, by the method that reads it.
+enum class stored_records : std::uint32_t {
+    error_dump = profiler_method::read_error_dump,
+    log = profiler_method::read_log,
+};
 
 // Hands every whole event record that the driver has stored to print: up to ten reads, until one
 // brings less than a record or fails. Without a driver, does nothing.

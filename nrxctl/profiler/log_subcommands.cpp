@@ -1,4 +1,3 @@
-#include <algorithm>
 #include <array>
 #include <optional>
 
@@ -6,6 +5,7 @@
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/profile_records.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/word_table.h"
 #include "nrxctl/decoders/record_text.h"
 #include "nrxctl/profiler/fw_profiler.h"
 #include "nrxctl/profiler/kernel_profiler.h"
@@ -36,9 +36,8 @@ constexpr std::array choice_words{
 std::optional<log_choice> choose_logs(argument_words& words) {
     log_choice choice;
     while (const auto word = words.take()) {
-        const auto* known = std::find_if(choice_words.begin(), choice_words.end(),
-                                         [&](const choice_word& one) { return one.word == *word; });
-        if (known == choice_words.end()) return std::nullopt;
+        const choice_word* known = find_word_row(choice_words, *word);
+        if (known == nullptr) return std::nullopt;
         choice.*(known->chosen) = true;
     }
     return choice;
@@ -83,9 +82,8 @@ void show_logs(argument_words& words) {
 // A word that is missing is as invalid as any other.
 void set_action_on_error(argument_words& words) {
     const std::string_view word = words.take().value_or("");
-    const auto* known = std::find_if(action_words.begin(), action_words.end(),
-                                     [&](const action_word& one) { return one.word == word; });
-    if (known == action_words.end()) {
+    const action_word* known = find_word_row(action_words, word);
+    if (known == nullptr) {
         print_line(text_line().text("invalid argument: ").text(word).view());
         return;
     }

@@ -7,7 +7,6 @@
 #include "nrxctl/base/numbers.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/profile_records.h"
-#include "nrxctl/base/refuse_word.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
 #include "nrxctl/base/tick_period.h"
@@ -74,11 +73,9 @@ void print_what_is_left(const profiler_conn& conn, record_printer print) {
 }  // namespace
 
 std::uint32_t parse_duration(std::string_view word) {
-    constexpr std::string_view message = "duration parameter is invalid";
     if (word == "auto") return 0;
-    const std::int64_t milliseconds = parse_number(word, message);
-    if (milliseconds < 0 || milliseconds > longest_duration) refuse_word(message, word);
-    return static_cast<std::uint32_t>(milliseconds) * milliseconds_to_microseconds;
+    return parse_number_up_to(longest_duration, word, "duration parameter is invalid") *
+           milliseconds_to_microseconds;
 }
 
 monitor_args parse_monitor_args(argument_words& words) {

@@ -26,10 +26,11 @@ std::uint32_t parse_duration(std::string_view word);
 // standard output.
 monitor_args parse_monitor_args(argument_words& words);
 
-// Prints the events of the driver's queue until the stream ends: at the end marker or, once events
-// arrive after the duration (microseconds; 0: none), which the coprocessor is told too. What comes
-// in the tenth of a second after that and what stands in the coprocessor's log follow, and "done".
-// False, with a failure report, if the monitor cannot start or the queue fails.
+// Prints the events of the driver's queue until the end marker or, with a duration (microseconds;
+// 0: none), until events arrive after it is over. The coprocessor is told the duration; this side
+// measures it by the tick period, which the front end has set. Then prints what arrives in another
+// 100 ms, the coprocessor's log, and "done". False, with a failure report, if the monitor cannot
+// start or the queue fails.
 bool monitor_profiler(std::uint32_t duration, record_printer print);
 
 // Prints the entries that the queue holds, up to the end marker, which sets ended and is not

@@ -1,10 +1,10 @@
 #include "nrxctl/profiler/profile_command.h"
 
-#include <algorithm>
 #include <array>
 
 #include "nrxctl/base/argument_words.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/word_table.h"
 #include "nrxctl/profiler/interrupt_stop.h"
 #include "nrxctl/profiler/subcommands.h"
 
@@ -60,11 +60,8 @@ constexpr std::array subcommands{
 void profile_command(std::string_view subcommand, std::span<char* const> words, int& index) {
     const interrupt_stop stop_while_running;
     argument_words further(words, index);
-    const auto* row =
-        std::find_if(subcommands.begin(), subcommands.end(),
-                     [&](const subcommand_row& known) { return known.word == subcommand; });
-    if (row != subcommands.end()) {
-        row->run(further);
+    if (const subcommand_row* known = find_word_row(subcommands, subcommand)) {
+        known->run(further);
         return;
     }
     further.put_first(subcommand);

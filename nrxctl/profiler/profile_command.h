@@ -12,7 +12,8 @@ namespace nrx {
 //
 // Prints on standard output; every failure is a failure report, and there is no result. A word that
 // is no number where one must stand ends the process with status 1. While the command runs, an
-// interrupt asks the driver to end the stream of events.
+// interrupt asks the driver to end the stream of events. Set tick_period first: without it a
+// duration is never over.
 void profile_command(std::string_view subcommand, std::span<char* const> words, int& index);
 
 }  // namespace nrx

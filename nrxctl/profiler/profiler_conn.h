@@ -35,13 +35,13 @@ public:
     profiler_conn() : service_conn(std::string(profiler_driver_name)) {}
 
     // Finds the driver by its registry name and opens a connection of type 0 on it. Whether the
-    // connection is open; if not, the check that failed is reported, but for a missing driver that
-    // is optional.
+    // connection is open; if not, the check that failed is reported, except that a missing driver
+    // is not when it is optional.
     bool open(presence driver);
 
     // Opens, maps the driver's event queue and attaches a port that is signalled when events
-    // arrive. Whether all of it stands; if not, the check that failed is reported, but for a
-    // mapping that is optional and fails or, reported as a success, hands over no memory.
+    // arrive. Whether all of it stands; if not, the check that failed is reported, except that an
+    // optional mapping that fails, or succeeds and hands over no memory, is not.
     bool open_queue(presence mapping);
 
     // None before a successful open_queue.

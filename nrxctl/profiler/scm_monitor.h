@@ -13,7 +13,7 @@ namespace nrx {
 //
 // Every failure is a failure report, and there is no result. A duration that is no number, or a
 // number in a word that is none, ends the process with status 1. An interrupt asks the driver to
-// end the stream of events.
+// end the stream of events. Set tick_period first: without it a duration is never over.
 void scm_monitor(std::string_view duration, std::span<char* const> words, int& index);
 
 }  // namespace nrx

@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <string_view>
 
+#include "nrxctl/base/field_text.h"
 #include "nrxctl/base/little_endian.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/text_line.h"
@@ -34,6 +35,7 @@ constexpr std::array columns{
     column{"max_latency", 60, base::decimal},
 };
 
+// In the firmware's own spelling.
 constexpr std::array<std::string_view, 27> wake_reason_names{
     "nrx_none",
     "nrx",
@@ -67,10 +69,7 @@ static_assert(wake_reason_names.size() * sizeof(std::uint32_t) == wake_requests_
 
 // The name of a row's thread, as much of it as is shown.
 std::string_view thread_of(platform::byte_view row) {
-    const auto thread = row.first(std::min(thread_size, name_width));
-    const auto end = std::find(thread.begin(), thread.end(), 0);
-    return {reinterpret_cast<const char*>(thread.data()),
-            static_cast<std::size_t>(end - thread.begin())};
+    return text_before_nul(row.first(std::min(thread_size, name_width)));
 }
 
 void print_row(platform::byte_view row) {

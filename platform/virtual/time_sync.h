@@ -14,9 +14,9 @@ struct sync_point {
     std::int64_t calendar;     // nanoseconds since 1970, UTC
 };
 
-// Registers the time-sync service of a coprocessor whose times now tells. Whoever reads its
-// property gets a sync point of the current second of the coprocessor's time, taken when the first
-// one in that second read it.
+// Registers a time-sync service. now tells the current instant in both times. The sync point that
+// the service publishes is taken anew when it is read, but at most once in a second of the
+// coprocessor's time.
 void add_time_sync(machine& host, std::function<sync_point()> now);
 
 }  // namespace platform::simulated

@@ -34,8 +34,8 @@ void add_sample_ranges(machine& device);
 // The boot time, and the time-sync service.
 void add_clocks(machine& device);
 
-// The profiler: the kernel's driver, and the service "profile". When it is enabled, as many events
-// happen in a second.
+// The profiler: the kernel's driver, and the service "profile". Once enabled, it produces that many
+// events in a second.
 void add_profiler(machine& device, std::uint32_t events_per_second = 50);
 
 }  // namespace platform::simulated

@@ -1,4 +1,4 @@
-#include "nrxctl/printers/report_printers.h"
+#include "nrxctl/printers/printer_registry.h"
 
 #include <algorithm>
 #include <array>

@@ -9,10 +9,10 @@
 namespace nrx {
 
 // Names by code; the first is the name of code 0.
-using name_table = std::span<const std::string_view>;
+using code_names = std::span<const std::string_view>;
 
 // The name of a code; the empty text for a code that has none.
-std::string_view name_of(name_table names, std::int32_t code);
+std::string_view name_of(code_names names, std::int32_t code);
 
 inline constexpr std::array<std::string_view, 3> speed_names{"Slow", "Medium", "Fast"};
 

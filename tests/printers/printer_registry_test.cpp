@@ -1,12 +1,12 @@
-#include "nrxctl/printers/report_printers.h"
+#include "nrxctl/printers/printer_registry.h"
 
 #include <vector>
 
 #include <gtest/gtest.h>
 
 #include "nrxctl/printers/diag_report.h"
+#include "nrxctl/printers/haptic_names.h"
 #include "nrxctl/printers/input_error_stats.h"
-#include "nrxctl/printers/name_tables.h"
 #include "nrxctl/printers/sample_ranges.h"
 #include "nrxctl/printers/transfer_errors.h"
 #include "tests/support/capture.h"
