@@ -15,6 +15,11 @@ std::unique_ptr<machine> make_wrist_device() {
     add_diagnostic_reports(*device);
     add_error_statistics(*device);
     add_sample_ranges(*device);
+    add_sensors(*device);
+    add_sensor_clients(*device);
+    add_sensor_state(*device);
+    add_extra_info(*device);
+    add_hid_events(*device);
     add_clocks(*device);
     add_profiler(*device);
     return device;

@@ -31,6 +31,21 @@ void add_error_statistics(machine& device);
 // The sample ranges of the motion sensors.
 void add_sample_ranges(machine& device);
 
+// What the sensors tell about themselves.
+void add_sensors(machine& device);
+
+// The clients of the sensors.
+void add_sensor_clients(machine& device);
+
+// The registers of the sensors, and the performance counters of the processor that serves them.
+void add_sensor_state(machine& device);
+
+// What the firmware of the sensors tells besides.
+void add_extra_info(machine& device);
+
+// The HID interfaces, and the events of each, behind the HID devices.
+void add_hid_events(machine& device);
+
 // The boot time, and the time-sync service.
 void add_clocks(machine& device);
 
