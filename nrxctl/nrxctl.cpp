@@ -20,8 +20,8 @@ constexpr int misuse_status = 2;
 constexpr std::size_t usual_report_capacity = 65'536;
 constexpr std::size_t largest_report_capacity = 1 << 20;
 
-// How an option went. The two command families say all that there is to say themselves: they are
-// always done.
+// How an option went. The command families and the inspection of a sensor say all that there is to
+// say themselves: they are always done.
 enum class outcome { done, failed, misused };
 
 outcome outcome_of(platform::return_code result) {
@@ -61,6 +61,15 @@ outcome profile(const option_words& words) {
 
 outcome scm(const option_words& words) {
     scm_monitor(words.argument, words.all, words.index);
+    return outcome::done;
+}
+
+outcome show_sensor(const option_words& words) {
+    std::uint32_t level = 1;
+    if (const auto word = words.take()) {
+        level = parse_up_to(std::numeric_limits<std::int32_t>::max(), *word, "level is invalid");
+    }
+    print_sensor_info(words.argument, static_cast<std::int32_t>(level));
     return outcome::done;
 }
 
@@ -128,6 +137,9 @@ constexpr std::array option_rows{
                "control the profiler; the subcommand help lists the others", profile},
     option_row{"scm", true, "DURATION CONFIG...",
                "print the coprocessor's bus transfers for DURATION milliseconds, or auto", scm},
+    option_row{"sensor", true, "NAME [LEVEL]",
+               "print a sensor's configuration; at level 2 also its clients and state",
+               show_sensor},
     option_row{"list", false, "", "list the interface services with their ids", list},
     option_row{"report", true, "SERVICE ID [CAPACITY]", "read a report and print it", read_report},
     option_row{"set-report", true, "SERVICE ID [u8|u16|u32] VALUE...", "write a report",

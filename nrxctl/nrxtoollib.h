@@ -23,6 +23,9 @@
 #include "nrxctl/profiler/profile_command.h"
 #include "nrxctl/profiler/scm_monitor.h"
 
+// Sensors
+#include "nrxctl/inspection/sensor_info.h"
+
 // Words in, lines out
 #include "nrxctl/base/end_process.h"
 #include "nrxctl/base/failure_report.h"

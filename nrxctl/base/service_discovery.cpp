@@ -13,10 +13,6 @@ namespace nrx {
 
 namespace {
 
-// Services of the always-on processor are registered under this prefix.
-constexpr std::string_view wqr_prefix = "WQR_";
-constexpr std::size_t longest_prefixed_name = 127;
-
 bool is_service_id(std::string_view name) {
     return name.starts_with(hex_prefix) || all_digits(name);
 }
@@ -47,14 +43,20 @@ platform::service find_hid_device_at(const platform::property& location) {
 
 }  // namespace
 
+std::string prefixed_name(std::string_view name) {
+    constexpr std::string_view prefix = "WQR_";
+    constexpr std::size_t longest = 127;
+    return std::string(prefix).append(name.substr(0, longest - prefix.size()));
+}
+
 platform::service find_service(std::string_view name) {
     if (is_service_id(name)) {
         const auto id = read_service_id(name);
         return id ? platform::first_match(match_service_id(*id)) : platform::service();
     }
-    std::string prefixed(wqr_prefix);
-    prefixed.append(name.substr(0, longest_prefixed_name - wqr_prefix.size()));
-    if (auto service = platform::first_match(match_service_name(prefixed))) return service;
+    if (auto service = platform::first_match(match_service_name(prefixed_name(name)))) {
+        return service;
+    }
     return platform::first_match(match_service_name(name));
 }
 

@@ -12,6 +12,10 @@
 
 namespace nrx {
 
+// The name under which the always-on processor registers a service: the prefix "WQR_" and the
+// service's own name, cut to 127 characters.
+std::string prefixed_name(std::string_view name);
+
 // The interface service with that name or id; none if there is none. A registry name is tried with
 // the prefix "WQR_" first (cut to 127 characters), then as given. Reports nothing; the caller owns
 // it.
