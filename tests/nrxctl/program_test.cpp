@@ -46,6 +46,8 @@ TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
         {{"list"}, "unknown word list"},
         {{"--list", "more"}, "unknown word more"},
         {{"--profile"}, "a word is missing after --profile"},
+        {{"--sensor"}, "a word is missing after --sensor"},
+        {{"--sensor", "accel", "1", "2"}, "unknown word 2"},
         {{"--report", "accel"}, "a word is missing after --report"},
         {{"--report", "accel", "--list"}, "a word is missing after --report"},
         {{"--set-report", "accel", "1"}, "a word is missing after --set-report"},
@@ -63,6 +65,8 @@ TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
 TEST(nrxctl_program, numbers_that_are_none_or_out_of_range_end_it_with_status_1) {
     EXPECT_EQ(run({"--report", "accel", "d0"}).out, "report id is invalid (d0)\n");
     EXPECT_EQ(run({"--report", "accel", "256"}).out, "report id is invalid (256)\n");
+    EXPECT_EQ(run({"--sensor", "accel", "two"}).out, "level is invalid (two)\n");
+    EXPECT_EQ(run({"--sensor", "accel", "0x80000000"}).out, "level is invalid (0x80000000)\n");
     EXPECT_EQ(run({"--report", "accel", "1", "0x100001"}).out, "capacity is invalid (0x100001)\n");
     const auto result = run({"--command", "accel", "0x100000000"});
     EXPECT_EQ(result.out, "command code is invalid (0x100000000)\n");
@@ -81,6 +85,24 @@ TEST(nrxctl_program, lists_every_interface_service_with_its_id) {
     EXPECT_GT(lines.size(), 10U);
     EXPECT_EQ(std::count(lines.begin(), lines.end(), "WQR_wqr-button           0x40"), 1);
     EXPECT_EQ(std::count(lines.begin(), lines.end(), "profile                  0x50"), 1);
+}
+
+TEST(nrxctl_program, shows_a_sensor_at_level_1_unless_told_otherwise) {
+    const auto summary = run({"--sensor", "gyro"});
+    EXPECT_EQ(summary.status, 0);
+    EXPECT_EQ(summary.err, "");
+    EXPECT_TRUE(summary.out.starts_with("Sensor type : gyro\nDevice      : "));
+    EXPECT_TRUE(summary.out.ends_with("\nSupportedRanges: 250 500 1000 2000 \n\n\n"));
+    EXPECT_EQ(run({"--sensor", "gyro", "1"}).out, summary.out);
+    const auto detailed = run({"--sensor", "gyro", "2", "--version"});
+    EXPECT_EQ(detailed.err, "");
+    const std::string details =
+        summary.out.substr(0, summary.out.size() - 2) + "Clients     : name  ";
+    EXPECT_EQ(detailed.out.substr(0, details.size()), details);
+    EXPECT_TRUE(detailed.out.ends_with("]\n\n\nnrxctl " NRXCTL_VERSION "\n"));
+    const auto unknown = run({"--sensor", "nobody"});
+    EXPECT_EQ(unknown.status, 0);
+    EXPECT_NE(unknown.out.find("\nAvailable HID services: accel gyro "), std::string::npos);
 }
 
 TEST(nrxctl_program, reads_writes_and_commands_and_tells_by_its_status_whether_all_went_well) {

@@ -159,6 +159,18 @@ TEST_F(wrist_device, has_every_report_in_its_length) {
              expected{"accel", 0x53, 28},
              expected{"gyro", 0x53, 28},
              expected{"compass", 0x53, 28},
+             expected{"temperature", 0x00, 4},
+             expected{"accel", 0x43, 20},
+             expected{"gyro", 0x0f, 32},
+             expected{"compass", 0x0b, 36},
+             expected{"compass", 0x1a, 12},
+             expected{"gyro", 0x18, 9},
+             expected{"als", 0x44, 5},
+             expected{"accel", 0x36, 5 * 4},
+             expected{"compass", 0x1d, 36},
+             expected{"compass", 0xd6, 12},
+             expected{"pressure", 0x38, 4 + 3 * 4},
+             expected{"accel", 0x31, 4 + 5 * 24},
          }) {
         EXPECT_EQ(report(name, id).size(), length) << name << " " << id;
     }
@@ -239,6 +251,50 @@ TEST_F(wrist_device, loses_few_packets_and_tells_where_they_went) {
         }
         EXPECT_NE(buses[row + 24], 0);
         EXPECT_EQ(buses[row + 31], 0);
+    }
+}
+
+TEST_F(wrist_device, has_sensors_that_sample_at_a_rate_which_they_support) {
+    for (const char* name : {"accel", "gyro", "compass", "pressure", "als", "temperature"}) {
+        const std::int64_t interval = u32(report(name, 0x00), 0);
+        const std::int64_t of_the_part = s32(report(name, 0x33), 0);
+        EXPECT_EQ(u32(report(name, 0x24), 0), of_the_part < interval ? 1 : 0) << name;
+        EXPECT_EQ(interval % of_the_part, 0) << name;
+        const byte_list supported = report(name, 0x3f);
+        std::set<std::int64_t> intervals;
+        for (std::size_t offset = 0; offset < supported.size(); offset += 4)
+            intervals.insert(u32(supported, offset));
+        EXPECT_EQ(intervals.count(interval), 1U) << name;
+        EXPECT_EQ(intervals.count(of_the_part), 1U) << name;
+        const byte_list batching = report(name, 0x43);
+        EXPECT_EQ(s32(batching, 16), s32(batching, 8) / interval) << name;
+        EXPECT_LT(s32(report(name, 0x3d), 0), 3) << name;
+        byte_list clients(496);
+        platform::byte_span entries = clients;
+        EXPECT_EQ(nrx::send_command(name, 0x39, {}, entries), platform::success) << name;
+        EXPECT_EQ(entries.size() % 31, 0U);
+        for (std::size_t entry = 0; entry < entries.size(); entry += 31)
+            EXPECT_GE(s32(clients, entry + 12), interval) << name;
+    }
+}
+
+TEST_F(wrist_device, counts_an_event_for_each_packet_that_was_sent_on) {
+    EXPECT_EQ(of_class("KeltoNRXHIDInterface").size(), 7U);
+    for (const char* name : {"wqr-button", "accel", "gyro", "compass"}) {
+        service entry = nrx::find_service(name);
+        for (int level = 0; level < 3; ++level)
+            entry = first_child(entry, "IOService");
+        const auto made = read_property(entry, "DebugState");
+        const auto queued = read_property(first_child(entry, "IOService"), "DebugState");
+        ASSERT_TRUE(made && queued) << name;
+        const auto number = [](const platform::property& state, const char* key) {
+            return state.entries()->find(key)->number().value();
+        };
+        const std::int64_t events = number(*made, "_num_events");
+        EXPECT_EQ(events, u32(report(name, 0xe3), 44)) << name;
+        EXPECT_EQ(number(*queued, "EnqueueEventCount") + number(*queued, "DroppedEventCount"),
+                  events)
+            << name;
     }
 }
 

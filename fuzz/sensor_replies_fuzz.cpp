@@ -1,0 +1,65 @@
+// Any bytes as the replies of a sensor. The first byte of the input chooses the sensor; then each
+// reply follows its identifier and its length, a byte each, or as much of it as there is. Replies
+// with the same identifier make one. The identifier 0xff is the reply that tells the clients.
+#include <algorithm>
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <string>
+
+#include "fuzz/support/harness.h"
+#include "nrxctl/inspection/client_table.h"
+#include "nrxctl/inspection/sensor_info.h"
+#include "platform/virtual/interface_driver.h"
+#include "platform/virtual/machine.h"
+
+namespace {
+
+using platform::simulated::byte_list;
+using platform::simulated::interface_driver;
+
+constexpr std::uint8_t clients_id = 0xff;
+constexpr std::array sensors{"accel", "gyro", "compass", "als"};
+
+void append_reply(interface_driver& sensor, std::uint8_t id, platform::byte_view part) {
+    const byte_list* before = sensor.report(id);
+    byte_list reply = before == nullptr ? byte_list() : *before;
+    reply.insert(reply.end(), part.begin(), part.end());
+    sensor.set_report(id, reply);
+}
+
+void put_replies(interface_driver& sensor, platform::byte_view input) {
+    while (input.size() >= 2) {
+        const std::uint8_t id = input[0];
+        const std::size_t length = std::min<std::size_t>(input[1], input.size() - 2);
+        append_reply(sensor, id, input.subspan(2, length));
+        input = input.subspan(2 + length);
+    }
+}
+
+}  // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    if (size == 0) return 0;
+    const std::string name = sensors[data[0] % sensors.size()];
+    platform::simulated::machine host;
+    const platform::simulated::installed_machine installed(host);
+    const auto sensor = std::make_shared<interface_driver>();
+    host.add({.name = name, .classes = {"KeltoNRXInterface"}, .unit = sensor});
+    // Without an interval there would be nothing to see.
+    append_reply(*sensor, 0, byte_list{0x10, 0x27, 0, 0});
+    put_replies(*sensor, {data + 1, size - 1});
+    if (const byte_list* clients = sensor->report(clients_id)) {
+        sensor->set_command(0x39, [clients](platform::byte_view, byte_list& reply) {
+            reply = *clients;
+            return platform::success;
+        });
+        // Here in an allocation of its own, so that a byte read beyond it is found.
+        const byte_list entries(clients->begin(), clients->end());
+        nrx::print_clients("", entries);
+    }
+    nrx::print_sensor_info(name, 2);
+    fuzz::require(host.open_handles() == 0);
+    return 0;
+}

@@ -1,0 +1,114 @@
+#include "nrxctl/inspection/extra_info.h"
+
+#include <cstdio>
+
+#include "tests/inspection/sensor_host.h"
+
+namespace tests {
+
+namespace {
+
+using namespace std::string_view_literals;
+using nrx::number_base;
+
+struct block_row {
+    std::string_view block;
+    std::string text;  // behind the label
+    number_base after = number_base::decimal;
+    std::size_t needed = 0;  // 0: nothing is missing
+};
+
+// From an allocation of its own size, so that a byte read beyond it is a sanitizer's find.
+outcome print_block(std::string_view block, number_base& base) {
+    const byte_list bytes = bytes_of(block);
+    return capture([&] { nrx::print_info_block(bytes, base); });
+}
+
+void expect_rows(const std::vector<block_row>& rows, number_base before) {
+    for (const block_row& row : rows) {
+        number_base base = before;
+        const outcome result = print_block(row.block, base);
+        EXPECT_EQ(result.out, "ExtraInfo   : " + row.text + "\n");
+        EXPECT_EQ(result.err, row.needed == 0 ? "" : too_short(row.needed, "extra_info.cpp"))
+            << row.text;
+        EXPECT_EQ(base, row.after) << row.text;
+    }
+}
+
+TEST(extra_info, items_follow_each_other_without_anything_between_them) {
+    expect_rows(
+        {
+            {"", ""},
+            {"\0\x80\xff\xff\xff"sv, "-128"},
+            {"\0\xff\xff\xff\x7f\0\0\0\0\x80"sv, "2147483647-2147483648"},
+            {"\1\xff\xff\xff\xff\xff\xff\xff\xff"sv, "-1"},
+            {"\1\1\2\3\4\5\6\7\x08"sv, "578437695752307201"},
+            {"\2\0"sv, ""},
+            {"\2ab\0\2 c\0\0\7\0\0\0"sv, "ab c7"},
+            {"\3"sv, "\nExtraInfo   : "},
+            {"\3\3\2x\0"sv, "\nExtraInfo   : \nExtraInfo   : x"},
+            {"\4\0\xff\xff\xff\xff\1\xfe\xff\xff\xff\xff\xff\xff\xff"sv, "fffffffffffffffffffffffe",
+             number_base::hexadecimal},
+            {"\4\0\x0a\0\0\0\5\0\x0a\0\0\0\4"sv, "a10", number_base::hexadecimal},
+            {"\5\5"sv, ""},
+        },
+        number_base::decimal);
+    expect_rows({{"\0\xff\0\0\0"sv, "ff", number_base::hexadecimal},
+                 {"\1\xff\0\0\0\0\0\0\0\5\1\xff\0\0\0\0\0\0\0"sv, "ff255"}},
+                number_base::hexadecimal);
+}
+
+TEST(extra_info, ends_with_the_block_whatever_the_last_item_lacks) {
+    expect_rows(
+        {
+            {"\0"sv, "", number_base::decimal, 5},
+            {"\0\1\2\3"sv, "", number_base::decimal, 5},
+            {"\2ok\0\0\1\2"sv, "ok", number_base::decimal, 9},
+            {"\1\1\2\3\4\5\6\7"sv, "", number_base::decimal, 9},
+            {"\0\5\0\0\0\3\1"sv, "5\nExtraInfo   : ", number_base::decimal, 15},
+            {"\2"sv, ""},
+            {"\2unended"sv, "unended"},
+        },
+        number_base::decimal);
+}
+
+TEST(extra_info, every_other_tag_ends_the_block_with_a_dump_of_it) {
+    for (int tag = 6; tag <= 255; ++tag) {
+        number_base base = number_base::decimal;
+        const std::string block = std::string("\2hi\0\4"sv) + static_cast<char>(tag) + "\2no";
+        const outcome result = print_block(block, base);
+        char dump[120];
+        std::snprintf(
+            dump, sizeof(dump),
+            "00000000: 02 68 69 00 04 %02x 02 6e  6f                       | .hi..%c.n o\n",
+            static_cast<unsigned>(tag), tag > 32 && tag < 127 ? tag : '.');
+        EXPECT_EQ(result.out, "ExtraInfo   : hi\ndata error\n" + std::string(dump) + "\n");
+        EXPECT_EQ(result.err, "");
+        EXPECT_EQ(base, number_base::hexadecimal);
+    }
+}
+
+}  // namespace
+
+using extra_info_of_a_sensor = device_test;
+
+TEST_F(extra_info_of_a_sensor, keeps_the_base_over_its_blocks_and_forgets_it_with_the_call) {
+    interface_driver& sensor = put_service(host, "accel", 31);
+    sensor.set_report(0x39, bytes_of("\0\x0a\0\0\0\4"sv));
+    sensor.set_report(0x3b, bytes_of("\0\x0b\0\0\0\7"sv));
+    sensor.set_report(0x3c, bytes_of("\0\x0c\0\0\0"sv));
+    for (int call = 0; call < 2; ++call) {
+        const outcome result = capture([] { nrx::print_extra_info("accel"); });
+        EXPECT_EQ(result.out,
+                  "ExtraInfo   : 10\n"
+                  "ExtraInfo   : \n"
+                  "ExtraInfo   : b\n"
+                  "data error\n"
+                  "00000000: 00 0b 00 00 00 07                                 | ......\n"
+                  "\n"
+                  "ExtraInfo   : c\n");
+        EXPECT_EQ(result.err, "");
+    }
+}
+
+}  // namespace tests
