@@ -19,7 +19,7 @@ std::unique_ptr<machine> make_wrist_device() {
     add_sensor_clients(*device);
     add_sensor_state(*device);
     add_extra_info(*device);
-    add_hid_events(*device);
+    add_hid_interfaces(*device);
     add_clocks(*device);
     add_profiler(*device);
     return device;

@@ -44,7 +44,7 @@ void add_sensor_state(machine& device);
 void add_extra_info(machine& device);
 
 // The HID interfaces, and the events of each, behind the HID devices.
-void add_hid_events(machine& device);
+void add_hid_interfaces(machine& device);
 
 // The boot time, and the time-sync service.
 void add_clocks(machine& device);

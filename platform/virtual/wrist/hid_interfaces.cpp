@@ -36,7 +36,7 @@ property debug_state(dictionary numbers) {
 
 }  // namespace
 
-void add_hid_events(machine& device) {
+void add_hid_interfaces(machine& device) {
     for (const event_row& row : event_counts) {
         const std::string name(row.service);
         const entry_ref hid_interface = device.add(
