@@ -22,6 +22,15 @@ struct calendar_instant {
     std::int64_t microseconds;
 };
 
+// One instant on the monotonic clock and on the wall clock.
+struct clock_reading {
+    std::uint64_t ticks;
+    calendar_instant wall;
+};
+
+// Reads both clocks at once.
+clock_reading read_clocks();
+
 // When the host was started: the same instant as long as the process lives. None if the host does
 // not tell.
 std::optional<calendar_instant> boot_time();

@@ -9,6 +9,7 @@
 #include "platform/property.h"
 #include "platform/virtual/driver.h"
 #include "platform/virtual/hid_unit.h"
+#include "platform/virtual/record_unit.h"
 
 namespace platform::simulated {
 
@@ -19,6 +20,7 @@ struct entry {
     std::function<void(dictionary&)> refresh = {};      // brings them up to date for a reader
     std::shared_ptr<driver> unit = nullptr;             // null: nothing to open here
     std::shared_ptr<hid_unit> hid = nullptr;            // null: no HID device
+    std::shared_ptr<record_unit> records = nullptr;     // null: its driver brings no plug-in
     std::vector<std::shared_ptr<entry>> children = {};  // in the service plane
     bool present = true;                                // false once the service is gone
 };

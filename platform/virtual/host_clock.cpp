@@ -13,11 +13,14 @@ namespace {
 // 24 ticks in a microsecond: a reader that takes ticks for another unit is found out.
 using tick = std::chrono::duration<std::uint64_t, std::ratio<1, 24'000'000>>;
 
+std::uint64_t ticks_at(simulated::machine_clock::time instant) {
+    return std::chrono::duration_cast<tick>(instant).count();
+}
+
 }  // namespace
 
 std::uint64_t ticks() {
-    const auto now = simulated::current_machine().clock().now();
-    return std::chrono::duration_cast<tick>(now).count();
+    return ticks_at(simulated::current_machine().clock().now());
 }
 
 double tick_period() {
@@ -34,6 +37,14 @@ void sleep(std::chrono::microseconds duration) {
         host.clock().pass(end);
         simulated::serve_interrupt();
     }
+}
+
+clock_reading read_clocks() {
+    const simulated::machine_clock& clock = simulated::current_machine().clock();
+    const auto now = clock.now();
+    const auto wall = std::chrono::duration_cast<std::chrono::microseconds>(clock.wall_at(now));
+    const auto seconds = std::chrono::duration_cast<std::chrono::seconds>(wall);
+    return {ticks_at(now), {seconds.count(), (wall - seconds).count()}};
 }
 
 std::optional<calendar_instant> boot_time() {

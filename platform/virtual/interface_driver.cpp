@@ -16,6 +16,9 @@ std::optional<std::uint32_t> narrow_scalar(std::uint64_t scalar) {
     return static_cast<std::uint32_t>(scalar);
 }
 
+// The one method that takes any count of scalars.
+constexpr std::uint32_t scalar_selector = 0;
+
 }  // namespace
 
 const byte_list* interface_driver::report(std::uint32_t id) const {
@@ -43,12 +46,21 @@ return_code interface_driver::call(std::uint32_t selector, const call_inputs& in
         method{4, {1, required, 0, none}, &interface_driver::write_named_property},
         method{5, {0, required, 0, required}, &interface_driver::read_named_property},
     };
+    if (selector == scalar_selector) return run_scalar_method(inputs, outputs);
     const auto* row = std::find_if(methods.begin(), methods.end(), [&](const method& candidate) {
         return candidate.selector == selector;
     });
     if (row == methods.end()) return unsupported;
     const return_code shape = check_shape(row->shape, inputs, outputs);
     return shape == success ? (this->*row->run)(inputs, outputs) : shape;
+}
+
+return_code interface_driver::run_scalar_method(const call_inputs& inputs,
+                                                const call_outputs& outputs) {
+    if (!scalar_method_) return unsupported;
+    const method_shape shape{inputs.scalars.size(), presence::none, 0, presence::none};
+    const return_code fitting = check_shape(shape, inputs, outputs);
+    return fitting == success ? scalar_method_(inputs.scalars) : fitting;
 }
 
 return_code interface_driver::write_report(const call_inputs& inputs, call_outputs& /*outputs*/) {

@@ -4,8 +4,10 @@
 #include <cstdint>
 #include <functional>
 #include <map>
+#include <span>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "platform/virtual/driver.h"
@@ -48,6 +50,12 @@ public:
     // Gives the service a command; any other command is unsupported.
     void set_command(std::uint32_t code, command run) { commands_[code] = std::move(run); }
 
+    // Carries out the service's scalar call, which takes any count of scalars.
+    using scalar_method = std::function<return_code(std::span<const std::uint64_t> scalars)>;
+
+    // Gives the service a scalar call; without one it is unsupported.
+    void set_scalar_method(scalar_method run) { scalar_method_ = std::move(run); }
+
     // Lets the service take and give named properties, and sets one.
     void set_named_property(std::string_view name, byte_list value);
 
@@ -55,6 +63,7 @@ public:
                      call_outputs& outputs) override;
 
 private:
+    return_code run_scalar_method(const call_inputs& inputs, const call_outputs& outputs);
     return_code write_report(const call_inputs& inputs, call_outputs& outputs);
     return_code read_report(const call_inputs& inputs, call_outputs& outputs);
     return_code run_command(const call_inputs& inputs, call_outputs& outputs);
@@ -65,6 +74,7 @@ private:
     std::map<std::uint32_t, report_source> report_sources_;
     std::map<std::uint32_t, report_sink> report_sinks_;
     std::map<std::uint32_t, command> commands_;
+    scalar_method scalar_method_;
     std::map<std::string, byte_list, std::less<>> named_properties_;
     bool has_named_properties_ = false;
 };

@@ -70,14 +70,51 @@ handle_id machine::lend_port() {
     return ports_.lend(next_handle(), nullptr);
 }
 
-entry_ref machine::service(handle_id id) const {
-    const entry_ref* found = services_.find(id);
+handle_id machine::lend_hid_plugin(entry_ref provider) {
+    return hid_plugins_.lend(next_handle(), std::move(provider));
+}
+
+handle_id machine::lend_hid_interface(std::shared_ptr<record_listener> listener) {
+    return hid_interfaces_.lend(next_handle(), std::move(listener));
+}
+
+handle_id machine::lend_hid_event_client(std::shared_ptr<event_listener> listener) {
+    return hid_event_clients_.lend(next_handle(), std::move(listener));
+}
+
+handle_id machine::lend_hid_service_list(std::vector<entry_ref> services) {
+    return hid_service_lists_.lend(next_handle(), std::move(services));
+}
+
+namespace {
+
+// What a table that lends out references holds under a number; null if it holds nothing.
+template <class Reference>
+Reference reference_in(const handle_table<Reference>& table, handle_id id) {
+    const Reference* found = table.find(id);
     return found == nullptr ? nullptr : *found;
 }
 
+}  // namespace
+
+entry_ref machine::service(handle_id id) const {
+    return reference_in(services_, id);
+}
+
 entry_ref machine::connection(handle_id id) const {
-    const entry_ref* found = connections_.find(id);
-    return found == nullptr ? nullptr : *found;
+    return reference_in(connections_, id);
+}
+
+entry_ref machine::hid_plugin(handle_id id) const {
+    return reference_in(hid_plugins_, id);
+}
+
+std::shared_ptr<record_listener> machine::hid_interface(handle_id id) const {
+    return reference_in(hid_interfaces_, id);
+}
+
+std::shared_ptr<event_listener> machine::hid_event_client(handle_id id) const {
+    return reference_in(hid_event_clients_, id);
 }
 
 bool machine::attach(handle_id port, std::shared_ptr<shared_queue> queue) {
@@ -87,8 +124,7 @@ bool machine::attach(handle_id port, std::shared_ptr<shared_queue> queue) {
 }
 
 std::shared_ptr<shared_queue> machine::attached_queue(handle_id port) const {
-    const auto* attached = ports_.find(port);
-    return attached == nullptr ? nullptr : *attached;
+    return reference_in(ports_, port);
 }
 
 void machine::take_back(handle_id id) {
@@ -100,12 +136,18 @@ void machine::take_back(handle_id id) {
     }
     mappings_.take_back(id);
     ports_.take_back(id);
+    loop_.unschedule(id);
+    hid_plugins_.take_back(id);
+    hid_interfaces_.take_back(id);
+    hid_event_clients_.take_back(id);
+    hid_service_lists_.take_back(id);
 }
 
 std::size_t machine::open_handles() const {
     const auto opened = hid_devices_.count_if([](const hid_object& one) { return one.is_open; });
     return services_.size() + connections_.size() + hid_devices_.size() + hid_devices_left_open_ +
-           opened + mappings_.size() + ports_.size();
+           opened + mappings_.size() + ports_.size() + hid_plugins_.size() +
+           hid_interfaces_.size() + hid_event_clients_.size() + hid_service_lists_.size();
 }
 
 void machine::fail_call(std::size_t n, failure how) {

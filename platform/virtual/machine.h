@@ -12,9 +12,12 @@
 #include "platform/clock.h"
 #include "platform/handle.h"
 #include "platform/virtual/entry.h"
+#include "platform/virtual/event_loop.h"
 #include "platform/virtual/failure.h"
 #include "platform/virtual/handle_table.h"
+#include "platform/virtual/hid_event_source.h"
 #include "platform/virtual/interrupts.h"
+#include "platform/virtual/listeners.h"
 #include "platform/virtual/machine_clock.h"
 
 namespace platform::simulated {
@@ -76,6 +79,10 @@ public:
     void set_boot_time(calendar_instant booted) { boot_time_ = booted; }
     [[nodiscard]] std::optional<calendar_instant> boot_time() const { return boot_time_; }
 
+    // The HID event system; none at first.
+    void set_hid_events(hid_event_system events) { hid_events_ = std::move(events); }
+    [[nodiscard]] const hid_event_system& hid_events() const { return hid_events_; }
+
     // --- what is lent out ---
 
     handle_id lend_service(entry_ref provider);
@@ -83,11 +90,21 @@ public:
     handle_id lend_hid_device(entry_ref provider);
     handle_id lend_mapping(queue_mapping mapping);
     handle_id lend_port();
+    handle_id lend_hid_plugin(entry_ref provider);
+    handle_id lend_hid_interface(std::shared_ptr<record_listener> listener);
+    handle_id lend_hid_event_client(std::shared_ptr<event_listener> listener);
+    handle_id lend_hid_service_list(std::vector<entry_ref> services);
 
-    // The entry behind a service, the provider of a connection, a HID device object, a mapping;
-    // null if there is no such handle.
+    // The entry behind a service, the provider of a connection or a HID plug-in, what else stands
+    // behind a handle; null if there is no such handle.
     [[nodiscard]] entry_ref service(handle_id id) const;
     [[nodiscard]] entry_ref connection(handle_id id) const;
+    [[nodiscard]] entry_ref hid_plugin(handle_id id) const;
+    [[nodiscard]] std::shared_ptr<record_listener> hid_interface(handle_id id) const;
+    [[nodiscard]] std::shared_ptr<event_listener> hid_event_client(handle_id id) const;
+    [[nodiscard]] const std::vector<entry_ref>* hid_service_list(handle_id id) const {
+        return hid_service_lists_.find(id);
+    }
     [[nodiscard]] hid_object* hid_device(handle_id id) { return hid_devices_.find(id); }
     [[nodiscard]] const queue_mapping* mapping(handle_id id) const { return mappings_.find(id); }
 
@@ -105,6 +122,9 @@ public:
     [[nodiscard]] std::size_t open_handles() const;
 
     machine_clock& clock() { return clock_; }
+
+    // The event loop of the thread.
+    event_loop& loop() { return loop_; }
 
     // --- what was asked ---
 
@@ -149,14 +169,20 @@ private:
     std::vector<entry_ref> entries_;
     std::map<std::string, std::vector<entry_ref>, std::less<>> by_class_;
     std::optional<calendar_instant> boot_time_;
+    hid_event_system hid_events_;
     handle_table<entry_ref> services_;
     handle_table<entry_ref> connections_;
     handle_table<hid_object> hid_devices_;
     std::size_t hid_devices_left_open_ = 0;
     handle_table<queue_mapping> mappings_;
     handle_table<std::shared_ptr<shared_queue>> ports_;  // null: nothing attached
+    handle_table<entry_ref> hid_plugins_;
+    handle_table<std::shared_ptr<record_listener>> hid_interfaces_;
+    handle_table<std::shared_ptr<event_listener>> hid_event_clients_;
+    handle_table<std::vector<entry_ref>> hid_service_lists_;
     handle_id last_handle_ = 0;
     machine_clock clock_;
+    event_loop loop_;
     std::vector<std::string> log_;
     bool recording_ = false;
     std::size_t calls_made_ = 0;

@@ -18,6 +18,12 @@ machine_clock::time machine_clock::now() const {
     return follows_host_ ? host_now() : manual_now_;
 }
 
+machine_clock::time machine_clock::wall_at(time instant) const {
+    if (!follows_host_) return wall_start_ + instant;
+    const time wall_now = std::chrono::system_clock::now().time_since_epoch();
+    return wall_now - (host_now() - instant);
+}
+
 bool machine_clock::pass(std::optional<time> until) {
     if (!follows_host_) return pass_manually(until);
     await_interrupt(until ? std::optional(*until - host_now()) : std::nullopt);

@@ -21,6 +21,11 @@ public:
 
     [[nodiscard]] time now() const;
 
+    // The same instant on the wall clock, as time since 1970, UTC. The manual clock started at the
+    // time that was set for it.
+    [[nodiscard]] time wall_at(time instant) const;
+    void set_wall_start(time wall) { wall_start_ = wall; }
+
     // Lets time pass until the given time, or without end, but only up to the next planned action,
     // which is then carried out, or the next interrupt, which is not served. False if nothing can
     // ever end it, on the manual clock alone.
@@ -41,6 +46,7 @@ private:
 
     bool follows_host_ = false;
     time manual_now_{0};
+    time wall_start_{0};
     std::vector<planned_action> planned_;
 };
 

@@ -53,4 +53,19 @@ void add_clocks(machine& device);
 // events in a second.
 void add_profiler(machine& device, std::uint32_t events_per_second = 50);
 
+// Named properties of services, and the self-test of the motion sensors.
+void add_named_properties(machine& device);
+
+// What switches the MCA: the commands and reports of the service "mca".
+void add_mca(machine& device);
+
+// The driver of all HID devices, which answers requests about them.
+void add_hid_driver(machine& device);
+
+// The SPI status records of the HID devices.
+void add_spi_records(machine& device);
+
+// The HID event system.
+void add_hid_events(machine& device);
+
 }  // namespace platform::simulated
