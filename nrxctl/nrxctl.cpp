@@ -4,12 +4,14 @@
 #include <cstdlib>
 #include <getopt.h>
 #include <limits>
-#include <optional>
 #include <span>
 #include <string>
 #include <vector>
 
 #include "nrxctl/nrxtoollib.h"
+#include "nrxctl/options/driver_options.h"
+#include "nrxctl/options/option_words.h"
+#include "nrxctl/options/watch_options.h"
 #include "platform/clock.h"
 
 namespace {
@@ -20,38 +22,9 @@ constexpr int misuse_status = 2;
 constexpr std::size_t usual_report_capacity = 65'536;
 constexpr std::size_t largest_report_capacity = 1 << 20;
 
-// How an option went. The command families and the inspection of a sensor say all that there is to
-// say themselves: they are always done.
-enum class outcome { done, failed, misused };
-
-outcome outcome_of(platform::return_code result) {
-    return result == platform::success ? outcome::done : outcome::failed;
-}
-
-// What stands behind an option: the option's own argument and all words of the command line, with
-// the option parser's index.
-struct option_words {
-    std::string_view argument;
-    std::span<char* const> all;
-    int& index;
-
-    // The next word; none at the end, and before the next option.
-    [[nodiscard]] std::optional<std::string_view> take() const {
-        const auto next = static_cast<std::size_t>(index);
-        if (next >= all.size() || *all[next] == '-') return std::nullopt;
-        ++index;
-        return all[next];
-    }
-};
-
-std::uint32_t parse_up_to(std::int64_t largest, std::string_view word, std::string_view message) {
-    const std::int64_t number = parse_number(word, message);
-    if (number < 0 || number > largest) refuse_word(message, word);
-    return static_cast<std::uint32_t>(number);
-}
-
 std::uint32_t parse_report_id(std::string_view word) {
-    return parse_up_to(std::numeric_limits<std::uint8_t>::max(), word, "report id is invalid");
+    return parse_number_up_to(std::numeric_limits<std::uint8_t>::max(), word,
+                              "report id is invalid");
 }
 
 outcome profile(const option_words& words) {
@@ -67,7 +40,8 @@ outcome scm(const option_words& words) {
 outcome show_sensor(const option_words& words) {
     std::uint32_t level = 1;
     if (const auto word = words.take()) {
-        level = parse_up_to(std::numeric_limits<std::int32_t>::max(), *word, "level is invalid");
+        level =
+            parse_number_up_to(std::numeric_limits<std::int32_t>::max(), *word, "level is invalid");
     }
     print_sensor_info(words.argument, static_cast<std::int32_t>(level));
     return outcome::done;
@@ -83,7 +57,7 @@ outcome read_report(const option_words& words) {
     const std::uint32_t id = parse_report_id(*id_word);
     std::size_t capacity = usual_report_capacity;
     if (const auto word = words.take()) {
-        capacity = parse_up_to(largest_report_capacity, *word, "capacity is invalid");
+        capacity = parse_number_up_to(largest_report_capacity, *word, "capacity is invalid");
     }
     std::vector<std::uint8_t> buffer(capacity);
     platform::byte_span report = buffer;
@@ -106,8 +80,8 @@ outcome write_report(const option_words& words) {
 outcome run_command(const option_words& words) {
     const auto code_word = words.take();
     if (!code_word) return outcome::misused;
-    const std::uint32_t code = parse_up_to(std::numeric_limits<std::uint32_t>::max(), *code_word,
-                                           "command code is invalid");
+    const std::uint32_t code = parse_number_up_to(std::numeric_limits<std::uint32_t>::max(),
+                                                  *code_word, "command code is invalid");
     std::vector<std::uint8_t> payload;
     parse_payload(words.all, words.index, payload);
     std::vector<std::uint8_t> buffer(usual_report_capacity);
@@ -146,6 +120,19 @@ constexpr std::array option_rows{
                write_report},
     option_row{"command", true, "SERVICE CODE [u8|u16|u32] [VALUE...]",
                "send a command and dump its reply", run_command},
+    option_row{"scalar", true, "SERVICE [SCALAR...]", "call the scalar method of a service",
+               call_scalar},
+    option_row{"get-property", true, "SERVICE NAME", "dump a named property of a service",
+               get_property},
+    option_row{"set-property", true, "SERVICE NAME [u8|u16|u32] VALUE...",
+               "set a named property of a service", set_property},
+    option_row{"hid-driver", false, "[u8|u16|u32] VALUE...",
+               "call the HID driver and dump its reply", ask_hid_driver},
+    option_row{"mca", true, "on|off", "switch the MCA", turn_mca},
+    option_row{"spi-status", true, "SERVICE MODE",
+               "print the SPI status records of a HID device until an interrupt", watch_spi},
+    option_row{"events", false, "[SECONDS]", "print HID events, for so long or until an interrupt",
+               watch_events},
     option_row{"help", false, "", "print this help", help},
     option_row{"version", false, "", "print the version", version},
 };

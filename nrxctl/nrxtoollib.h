@@ -4,8 +4,12 @@
 
 // Services and their command channel
 #include "nrxctl/base/command_channel.h"
+#include "nrxctl/base/hid_driver.h"
 #include "nrxctl/base/matching.h"
+#include "nrxctl/base/mca.h"
+#include "nrxctl/base/named_property.h"
 #include "nrxctl/base/profile_records.h"
+#include "nrxctl/base/scalar_method.h"
 #include "nrxctl/base/service_conn.h"
 #include "nrxctl/base/service_discovery.h"
 #include "nrxctl/base/service_list.h"
@@ -25,6 +29,13 @@
 
 // Sensors
 #include "nrxctl/inspection/sensor_info.h"
+
+// HID events and SPI status records as they arrive
+#include "nrxctl/inspection/hid_event_times.h"
+#include "nrxctl/inspection/hid_event_watch.h"
+#include "nrxctl/inspection/hid_events.h"
+#include "nrxctl/inspection/hid_statistics.h"
+#include "nrxctl/inspection/spi_watch.h"
 
 // Words in, lines out
 #include "nrxctl/base/end_process.h"

@@ -1,19 +1,26 @@
 #include "nrxctl/base/channel.h"
 
+#include <utility>
+
 #include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/service_discovery.h"
 
 namespace nrx {
 
-platform::return_code open_channel(std::string_view service_name, missing_service missing,
-                                   channel& opened) {
-    opened.service = find_service(service_name);
-    if (!opened.service && missing == missing_service::is_silent) return platform::not_found;
+platform::return_code open_channel(platform::service found, std::uint32_t type, channel& opened) {
+    opened.service = std::move(found);
     if (!check(opened.service, "service")) return platform::not_found;
-    const platform::return_code kr = platform::open(opened.service, 0, opened.connect);
+    const platform::return_code kr = platform::open(opened.service, type, opened.connect);
     if (!check_success(kr, "kr == 0 ")) return kr;
     if (!check(opened.connect, "connect")) return platform::no_memory;
     return platform::success;
+}
+
+platform::return_code open_channel(std::string_view service_name, missing_service missing,
+                                   channel& opened) {
+    platform::service found = find_service(service_name);
+    if (!found && missing == missing_service::is_silent) return platform::not_found;
+    return open_channel(std::move(found), 0, opened);
 }
 
 }  // namespace nrx

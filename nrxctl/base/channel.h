@@ -1,6 +1,7 @@
 // A connection to a named interface service, for the length of one operation.
 #pragma once
 
+#include <cstdint>
 #include <string_view>
 
 #include "platform/connection.h"
@@ -14,12 +15,16 @@ struct channel {
     platform::connection connect;
 };
 
+// Opens a connection of the given type on a service that was looked up before. Fails, with a
+// failure report for the check that did not hold, with not_found if the look-up found none, the
+// platform's code if the service cannot be opened, and no_memory if opening hands back no
+// connection.
+platform::return_code open_channel(platform::service found, std::uint32_t type, channel& opened);
+
 enum class missing_service { is_reported, is_silent };
 
-// Finds a service by name and opens a connection of type 0 on it. Fails, with a failure report for
-// the check that did not hold, with not_found if there is no such service (silently if so asked),
-// the platform's code if the service cannot be opened, and no_memory if opening hands back no
-// connection.
+// Finds a service by name and opens a connection of type 0 on it. Fails as the above does, but for
+// a missing service silently if so asked.
 platform::return_code open_channel(std::string_view service_name, missing_service missing,
                                    channel& opened);
 

@@ -1,0 +1,27 @@
+#include "nrxctl/inspection/event_stream.h"
+
+#include <sstream>
+
+#include "nrxctl/base/output.h"
+
+namespace nrx {
+
+namespace {
+
+std::ostringstream& line_stream() {
+    static std::ostringstream stream;
+    return stream;
+}
+
+}  // namespace
+
+std::ostream& event_stream() {
+    return line_stream();
+}
+
+void end_event_line() {
+    print_line(line_stream().view());
+    line_stream().str({});
+}
+
+}  // namespace nrx

@@ -1,0 +1,10 @@
+#include "nrxctl/options/option_words.h"
+
+#include <cstddef>
+
+std::optional<std::string_view> option_words::take() const {
+    const auto next = static_cast<std::size_t>(index);
+    if (next >= all.size() || *all[next] == '-') return std::nullopt;
+    ++index;
+    return all[next];
+}
