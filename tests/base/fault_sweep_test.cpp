@@ -4,7 +4,11 @@
 #include <array>
 
 #include "nrxctl/base/command_channel.h"
+#include "nrxctl/base/hid_driver.h"
+#include "nrxctl/base/mca.h"
+#include "nrxctl/base/named_property.h"
 #include "nrxctl/base/profile_records.h"
+#include "nrxctl/base/scalar_method.h"
 #include "nrxctl/base/service_conn.h"
 #include "nrxctl/base/service_discovery.h"
 #include "nrxctl/base/service_property.h"
@@ -18,6 +22,18 @@ using tests::fault;
 using tests::is_told;
 using tests::sweep_faults;
 
+// A driver of its own type, whose one method answers with a byte.
+class zumo_driver final : public platform::simulated::driver {
+public:
+    platform::return_code open(std::uint32_t type) override {
+        return type == 0x7a756d6f ? platform::success : platform::unsupported;
+    }
+    platform::return_code call(std::uint32_t /*selector*/, const platform::call_inputs& /*inputs*/,
+                               platform::call_outputs& outputs) override {
+        return platform::simulated::answer(byte_list{1}, outputs);
+    }
+};
+
 std::unique_ptr<tests::machine> make_host() {
     auto host = std::make_unique<tests::machine>();
     auto& accel = tests::put_service(*host, "accel", 31);
@@ -26,6 +42,16 @@ std::unique_ptr<tests::machine> make_host() {
         reply = {1};
         return platform::success;
     });
+    accel.set_named_property("gain", {1, 2});
+    accel.set_scalar_method([](std::span<const std::uint64_t>) { return platform::success; });
+    auto& mca = tests::put_service(*host, "mca", 33);
+    for (const std::uint32_t command : {0x20U, 0x22U})
+        mca.set_command(command, [](platform::byte_view, byte_list&) { return platform::success; });
+    mca.set_report(0x16, {});
+    mca.set_report(0xd8, {});
+    host->add({.name = "KeltoNRXHIDDriver",
+               .properties = {{"LocationID", 1234}},
+               .unit = std::make_shared<zumo_driver>()});
     tests::put_service(*host, "profile", 32).set_report(0xd1, byte_list(96));
     const auto app = host->add({.name = "NRXApp"});
     host->add({.name = "client", .unit = std::make_shared<tests::interface_driver>()}, app);
@@ -53,6 +79,31 @@ TEST(base_fault_sweep, reports_of_the_command_channel) {
             nrx::send_command("accel", 0x20, byte_list{1}, room);
         },
         is_told);
+}
+
+TEST(base_fault_sweep, further_operations) {
+    sweep_faults(
+        make_host, [] { nrx::call_scalar_method("accel", {}); }, is_told);
+    sweep_faults(
+        make_host, [] { nrx::set_named_property("accel", "gain", byte_list{3}); }, is_told);
+    sweep_faults(
+        make_host,
+        [] {
+            platform::byte_span room = buffer;
+            nrx::get_named_property("accel", "gain", room);
+        },
+        is_told);
+    sweep_faults(
+        make_host,
+        [] {
+            platform::byte_span room = buffer;
+            nrx::call_hid_driver(byte_list{1}, room);
+        },
+        is_told);
+    for (const bool on : {true, false}) {
+        sweep_faults(
+            make_host, [&] { nrx::switch_mca(on); }, is_told);
+    }
 }
 
 TEST(base_fault_sweep, probing_reports_a_failed_open_and_nothing_else) {

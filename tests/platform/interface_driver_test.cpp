@@ -136,6 +136,21 @@ TEST_F(interface_service, carries_out_a_command) {
     EXPECT_EQ(code_of(3, {0x1'0000'0020}, {}, 8), unsupported);
 }
 
+TEST_F(interface_service, hands_any_count_of_scalars_to_its_scalar_call_and_nothing_else) {
+    EXPECT_EQ(code_of(0, {1}, {}, 0), unsupported);
+    std::vector<std::uint64_t> received;
+    driver.set_scalar_method([&](std::span<const std::uint64_t> scalars) {
+        received.assign(scalars.begin(), scalars.end());
+        return scalars.empty() ? platform::no_memory : success;
+    });
+    EXPECT_EQ(code_of(0, {1, 0x1'0000'0002}, {}, 0), success);
+    EXPECT_EQ(received, (std::vector<std::uint64_t>{1, 0x1'0000'0002}));
+    EXPECT_EQ(code_of(0, {}, {}, 0), platform::no_memory);
+    EXPECT_EQ(code_of(0, {1}, {1}, 0), bad_argument);
+    EXPECT_EQ(code_of(0, {1}, {}, 8), bad_argument);
+    EXPECT_EQ(code_of(0, {1}, {}, 0, 1), bad_argument);
+}
+
 TEST_F(interface_service, passes_on_the_code_of_a_command_and_no_reply_of_a_failed_one) {
     driver.set_command(0x21, [](platform::byte_view, byte_list& answer) {
         answer = {1};

@@ -151,6 +151,21 @@ TEST_F(host_clock, counts_ticks_of_the_period_that_it_tells) {
     EXPECT_GT(platform::ticks() - before, 250'000U);
 }
 
+TEST_F(host_clock, reads_the_same_instant_on_both_clocks) {
+    host.clock().set_wall_start(1'700'000'000'250'000us);
+    platform::sleep(1'500'000us);
+    const auto reading = platform::read_clocks();
+    EXPECT_EQ(reading.ticks, platform::ticks());
+    EXPECT_EQ(reading.wall.seconds, 1'700'000'001);
+    EXPECT_EQ(reading.wall.microseconds, 750'000);
+    host.clock().follow_host();
+    const auto before = std::chrono::system_clock::now().time_since_epoch();
+    const auto wall = platform::read_clocks().wall;
+    const auto told = std::chrono::seconds(wall.seconds) + wall.microseconds * 1us;
+    EXPECT_GE(told, before - 1us);
+    EXPECT_LT(told, before + 1s);
+}
+
 TEST_F(host_clock, sleeps_as_long_as_asked_when_it_follows_the_host) {
     host.clock().follow_host();
     const auto before = std::chrono::steady_clock::now();
