@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <chrono>
+#include <ctime>
 #include <sstream>
 #include <thread>
 
@@ -53,6 +54,11 @@ TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
         {{"--set-report", "accel", "1"}, "a word is missing after --set-report"},
         {{"--set-report", "accel"}, "a word is missing after --set-report"},
         {{"--command", "accel"}, "a word is missing after --command"},
+        {{"--get-property", "accel"}, "a word is missing after --get-property"},
+        {{"--set-property", "accel"}, "a word is missing after --set-property"},
+        {{"--set-property", "accel", "gain", "u8"}, "a word is missing after --set-property"},
+        {{"--hid-driver", "--list"}, "a word is missing after --hid-driver"},
+        {{"--spi-status", "accel"}, "a word is missing after --spi-status"},
         {{"--help=x"}, "unknown option --help=x"},
     };
     for (const misuse_row& row : rows) {
@@ -68,6 +74,11 @@ TEST(nrxctl_program, numbers_that_are_none_or_out_of_range_end_it_with_status_1)
     EXPECT_EQ(run({"--sensor", "accel", "two"}).out, "level is invalid (two)\n");
     EXPECT_EQ(run({"--sensor", "accel", "0x80000000"}).out, "level is invalid (0x80000000)\n");
     EXPECT_EQ(run({"--report", "accel", "1", "0x100001"}).out, "capacity is invalid (0x100001)\n");
+    EXPECT_EQ(run({"--scalar", "accel", "1", "x"}).out, "scalar is invalid (x)\n");
+    EXPECT_EQ(run({"--spi-status", "accel", "4294967296"}).out, "mode is invalid (4294967296)\n");
+    EXPECT_EQ(run({"--events", "2147483648"}).out, "seconds are invalid (2147483648)\n");
+    EXPECT_EQ(run({"--events", "1.5"}).out, "seconds are invalid (1.5)\n");
+    EXPECT_EQ(run({"--mca", "On"}).out, "mca is neither on nor off (On)\n");
     const auto result = run({"--command", "accel", "0x100000000"});
     EXPECT_EQ(result.out, "command code is invalid (0x100000000)\n");
     EXPECT_EQ(result.status, 1);
@@ -190,6 +201,108 @@ TEST(nrxctl_program, interrupted_in_a_stream_twice_and_in_the_grace_it_ends_once
     monitor.send_interrupt();
     EXPECT_EQ(monitor.finish(), 0);
     EXPECT_TRUE(monitor.out().ends_with("\ndone\n"));
+}
+
+TEST(nrxctl_program, calls_drivers_beside_their_reports_and_tells_how_it_went) {
+    const auto chain = run({"--scalar",
+                            "accel",
+                            "0x5",
+                            "--get-property",
+                            "accel",
+                            "self-test",
+                            "--set-property",
+                            "16",
+                            "gain",
+                            "u16",
+                            "1",
+                            "0d10",
+                            "--get-property",
+                            "accel",
+                            "gain",
+                            "--hid-driver",
+                            "u32",
+                            "1",
+                            "0",
+                            "--mca",
+                            "on",
+                            "--get-property",
+                            "mca",
+                            "mode-60",
+                            "--mca",
+                            "off"});
+    EXPECT_EQ(chain.status, 0);
+    EXPECT_EQ(chain.err, "");
+    EXPECT_EQ(chain.out,
+              "00000000: 05 00 00 00                                       | ....\n"
+              "00000000: 01 00 0a 00                                       | ....\n"
+              "00000000: 01 00 00 00 00 00 00 00  07 00 00 00 00 00 00 00  | ........ ........\n"
+              "Turning ON MCA\n"
+              "00000000: 01 00 00 00                                       | ....\n"
+              "Turning OFF MCA\n");
+    for (const words& failing :
+         {words{"--scalar", "accel"}, words{"--scalar", "mux", "1"}, words{"--hid-driver", "1"},
+          words{"--get-property", "accel", "colour"}, words{"--set-property", "mux", "x", "1"},
+          words{"--spi-status", "nobody", "1"}}) {
+        EXPECT_EQ(run(failing).status, 1) << failing[0];
+    }
+}
+
+TEST(nrxctl_program, prints_hid_events_for_a_time_a_whole_line_per_write) {
+    const auto started = std::chrono::steady_clock::now();
+    const auto lines = tests::writes_of(program, {"--events", "2"});
+    EXPECT_GE(std::chrono::steady_clock::now() - started, 2s);
+    const auto beginning = [&](const std::string& text) {
+        return std::count_if(lines.begin(), lines.end(),
+                             [&](const std::string& line) { return line.starts_with(text); });
+    };
+    for (const std::string& line : lines)
+        EXPECT_EQ(line.find('\n'), line.size() - 1) << line;
+    EXPECT_EQ(beginning("[null] "), 2);
+    EXPECT_EQ(beginning("[accelerometer] "), 10);
+    EXPECT_EQ(beginning("now: "), 4);
+    EXPECT_EQ(beginning("type: 2latency: "), 1);
+    EXPECT_EQ(beginning("TALY_CALLBACK: "), 3);
+    EXPECT_EQ(beginning("ResetCallback 0x"), 1);
+    // The first vendor-defined event, on the wall clock.
+    const auto vendor = std::find_if(lines.begin(), lines.end(), [](const std::string& line) {
+        return line.starts_with("now: ");
+    });
+    ASSERT_NE(vendor, lines.end());
+    const double wall = std::stod(vendor->substr(vendor->find("wall: ") + 6));
+    EXPECT_NEAR(wall, static_cast<double>(std::time(nullptr)), 10);
+}
+
+TEST(nrxctl_program, events_block_without_processor_time_and_end_at_once_when_interrupted) {
+    running_program events(program, {"--events", "--version"});
+    ASSERT_TRUE(events.wait_for("[accelerometer] "));
+    const auto interrupted = std::chrono::steady_clock::now();
+    events.send_interrupt();
+    EXPECT_EQ(events.finish(), 0);
+    EXPECT_LT(std::chrono::steady_clock::now() - interrupted, 2s);
+    EXPECT_TRUE(events.out().ends_with("\nnrxctl " NRXCTL_VERSION "\n"));
+    EXPECT_LT(events.processor_time(), 0.1);
+}
+
+TEST(nrxctl_program, spi_status_is_switched_off_again_when_interrupted) {
+    const std::string found = "Found an id for service = 17\n";
+    running_program watch(program, {"--spi-status", "gyro", "2"});
+    ASSERT_TRUE(watch.wait_for("STATUS: errorCode(0x7001)"));
+    watch.send_interrupt();
+    EXPECT_EQ(watch.finish(), 0);
+    EXPECT_TRUE(watch.out().starts_with(found + "\ntimestamp: "));
+    EXPECT_TRUE(watch.out().ends_with("\n" + found));
+    EXPECT_EQ(run({"--spi-status", "17", "0"}).out, found);
+}
+
+TEST(nrxctl_program, spi_status_interrupted_as_soon_as_it_begins_ends_all_the_same) {
+    for (int round = 0; round < 10; ++round) {
+        running_program watch(program, {"--spi-status", "0x10", "1"});
+        ASSERT_TRUE(watch.wait_for("Found an id for service = 16\n"));
+        std::this_thread::sleep_for(round * 200us);
+        watch.send_interrupt();
+        EXPECT_EQ(watch.finish(), 0);
+        EXPECT_TRUE(watch.out().ends_with("Found an id for service = 16\n"));
+    }
 }
 
 TEST(nrxctl_program, output_that_nobody_reads_ends_nothing) {
