@@ -20,8 +20,7 @@ inline constexpr std::uint32_t accelerometer_subtype = 0xd0004;
 inline constexpr std::uint32_t accelerometer_sequence = 0xd0005;
 
 // One event. Plain value semantics: a copy shares nothing with its source.
-class hid_event {
-public:
+struct hid_event {
     template <class Number>
     struct field {
         std::uint32_t id;

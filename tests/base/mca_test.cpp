@@ -35,6 +35,8 @@ std::string mode_call(const std::string& first_bytes) {
 }
 
 TEST_F(mca, is_switched_on_in_six_steps) {
+    const std::string buffer_words =
+        "00 00 00 00 00 00 00 00 00 00 00 00 80 00 00 00 00 00 00 00 00 20 00 00";
     const auto result = capture([] { EXPECT_EQ(nrx::switch_mca(true), platform::success); });
     EXPECT_EQ(result.out, "Turning ON MCA\n");
     EXPECT_EQ(result.err, "");
@@ -43,8 +45,7 @@ TEST_F(mca, is_switched_on_in_six_steps) {
         (lines{"call mca 3 scalars [0x20] in [01] results 0 room 0",
                mode_call("10 00 00 00 01 03 00 00 00"), mode_call("3c 00 00 00 01 01 00 00 00"),
                mode_call("80 00 00 00 01 03 00 00 00"),
-               "call mca 1 scalars [0xd8] in [00 00 00 00 00 00 00 00 00 00 00 00 "
-               "80 00 00 00 00 00 00 00 00 20 00 00] results 0 room 0",
+               "call mca 1 scalars [0xd8] in [" + buffer_words + "] results 0 room 0",
                "call mca 1 scalars [0x16] in [10 27 00 00] results 0 room 0"}));
 }
 
