@@ -9,7 +9,6 @@
 namespace platform::simulated {
 
 void event_loop::schedule(handle_id owner, const std::shared_ptr<loop_source>& source) {
-    unschedule(owner);
     scheduled_.push_back({owner, source});
 }
 
