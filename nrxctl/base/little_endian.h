@@ -20,6 +20,15 @@ constexpr Number load_le(const std::uint8_t* source) {
     return static_cast<Number>(value);
 }
 
+// Writes a number into the first sizeof(Number) bytes at target.
+template <std::integral Number>
+constexpr void store_le(std::uint8_t* target, Number value) {
+    const auto bits = static_cast<std::make_unsigned_t<Number>>(value);
+    for (std::size_t i = 0; i < sizeof(Number); ++i) {
+        target[i] = static_cast<std::uint8_t>(bits >> (8 * i));
+    }
+}
+
 // Appends the low width bytes of a number, least significant first.
 inline void append_le(std::vector<std::uint8_t>& bytes, std::uint64_t value, std::size_t width) {
     for (std::size_t i = 0; i < width; ++i) {

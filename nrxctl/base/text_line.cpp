@@ -29,6 +29,14 @@ text_line& text_line::hex(std::uint64_t value, std::size_t width) {
     return right({digits, static_cast<std::size_t>(end.ptr - digits)}, width);
 }
 
+text_line& text_line::zero_padded_hex(std::uint64_t value, std::size_t width) {
+    char digits[16];
+    const auto end = std::to_chars(digits, digits + sizeof(digits), value, 16);
+    const std::string_view written(digits, static_cast<std::size_t>(end.ptr - digits));
+    text_.append(missing(written, width), '0').append(written);
+    return *this;
+}
+
 text_line& text_line::general(double value) {
     constexpr int significant_digits = 6;
     char digits[32];

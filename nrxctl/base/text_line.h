@@ -32,6 +32,9 @@ public:
     // A number in lower-case hexadecimal, right-aligned in a field of width characters.
     text_line& hex(std::uint64_t value, std::size_t width = 0);
 
+    // The same, filled up with zeros.
+    text_line& zero_padded_hex(std::uint64_t value, std::size_t width);
+
     // A fraction as printf's %g writes it, with six significant digits. A value in single precision
     // is converted exactly.
     text_line& general(double value);

@@ -16,6 +16,9 @@ TEST(text_line, pads_and_never_cuts) {
     line.clear();
     line.number(-7, 4).text("|").number(12345, 4).text("|").hex(0x1f, 4);
     EXPECT_EQ(line.view(), "  -7|12345|  1f");
+    line.clear();
+    line.zero_padded_hex(0x1f, 4).text("|").zero_padded_hex(0x12345, 4);
+    EXPECT_EQ(line.view(), "001f|12345");
 }
 
 TEST(text_line, writes_numbers_to_their_limits) {
