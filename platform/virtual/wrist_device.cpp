@@ -22,6 +22,7 @@ std::unique_ptr<machine> make_wrist_device() {
     add_hid_interfaces(*device);
     add_clocks(*device);
     add_profiler(*device);
+    add_replay(*device);
     add_named_properties(*device);
     add_mca(*device);
     add_hid_driver(*device);

@@ -14,7 +14,8 @@ TEST(return_code, every_known_code_has_a_text_of_its_own) {
     std::set<std::string_view> texts{unknown};
     for (const auto code :
          {platform::success, platform::no_memory, platform::bad_argument, platform::unsupported,
-          platform::not_found, platform::simulated::io_failure, platform::simulated::no_room}) {
+          platform::not_found, platform::simulated::io_failure, platform::simulated::no_room,
+          platform::simulated::not_ready}) {
         const std::string_view text = platform::return_code_text(code);
         EXPECT_FALSE(text.empty());
         EXPECT_TRUE(texts.insert(text).second) << text;

@@ -4,7 +4,7 @@
 #include <set>
 
 #include "platform/data_queue.h"
-#include "platform/virtual/profiler/little_endian.h"
+#include "platform/virtual/little_endian.h"
 #include "platform/virtual/profiler/profiler.h"
 #include "tests/support/device_test.h"
 

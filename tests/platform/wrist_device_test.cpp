@@ -134,6 +134,18 @@ TEST_F(wrist_device, lets_the_client_of_the_replay_application_be_opened) {
     EXPECT_TRUE(nrx::service_conn("NRXApp").open(false));
 }
 
+TEST_F(wrist_device, plays_samples_back_with_the_sensors_of_motion_and_pressure) {
+    const byte_list states = report("NRXApp", 0x47);
+    ASSERT_EQ(states.size(), 4 * 12U);
+    std::vector<std::string> names;
+    for (std::size_t offset = 0; offset < states.size(); offset += 12) {
+        EXPECT_TRUE(nrx::service_name_for_id(static_cast<std::int32_t>(u32(states, offset)),
+                                             names.emplace_back()));
+        EXPECT_EQ(u32(states, offset + 8), 0);
+    }
+    EXPECT_EQ(names, (std::vector<std::string>{"accel", "gyro", "compass", "pressure"}));
+}
+
 TEST_F(wrist_device, has_every_report_in_its_length) {
     struct expected {
         const char* service;

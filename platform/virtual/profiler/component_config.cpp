@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "platform/virtual/profiler/little_endian.h"
+#include "platform/virtual/little_endian.h"
 
 namespace platform::simulated {
 

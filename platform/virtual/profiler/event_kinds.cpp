@@ -18,8 +18,8 @@
 #include <array>
 #include <string_view>
 
+#include "platform/virtual/little_endian.h"
 #include "platform/virtual/profiler/event_record.h"
-#include "platform/virtual/profiler/little_endian.h"
 
 namespace platform::simulated {
 

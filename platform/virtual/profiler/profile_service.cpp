@@ -1,6 +1,6 @@
 // The coprocessor's half of the virtual profiler behind the interface service "profile".
 
-#include "platform/virtual/profiler/little_endian.h"
+#include "platform/virtual/little_endian.h"
 #include "platform/virtual/profiler/profiler.h"
 
 namespace platform::simulated {

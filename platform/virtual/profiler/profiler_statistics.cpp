@@ -4,7 +4,7 @@
 #include <array>
 #include <string_view>
 
-#include "platform/virtual/profiler/little_endian.h"
+#include "platform/virtual/little_endian.h"
 
 namespace platform::simulated {
 

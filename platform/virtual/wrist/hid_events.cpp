@@ -9,7 +9,7 @@
 #include <string_view>
 
 #include "platform/clock.h"
-#include "platform/virtual/profiler/little_endian.h"
+#include "platform/virtual/little_endian.h"
 #include "platform/virtual/wrist/parts.h"
 #include "platform/virtual/wrist/report_table.h"
 

@@ -4,7 +4,7 @@
 #include <array>
 #include <string>
 
-#include "platform/virtual/profiler/little_endian.h"
+#include "platform/virtual/little_endian.h"
 #include "platform/virtual/wrist/parts.h"
 #include "platform/virtual/wrist/services.h"
 

@@ -53,6 +53,9 @@ void add_clocks(machine& device);
 // events in a second.
 void add_profiler(machine& device, std::uint32_t events_per_second = 50);
 
+// The replay application.
+void add_replay(machine& device);
+
 // Named properties of services, and the self-test of the motion sensors.
 void add_named_properties(machine& device);
 

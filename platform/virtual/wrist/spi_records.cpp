@@ -6,7 +6,7 @@
 #include <memory>
 
 #include "platform/registry.h"
-#include "platform/virtual/profiler/little_endian.h"
+#include "platform/virtual/little_endian.h"
 #include "platform/virtual/wrist/parts.h"
 
 namespace platform::simulated {

@@ -1,4 +1,4 @@
-// Little-endian numbers in the records of the virtual profiler.
+// Little-endian numbers in what the virtual host sends and is sent.
 #pragma once
 
 #include <cstddef>
