@@ -1,5 +1,6 @@
 // nrxctl: the entry points of the tool library at a person's hand.
 
+#include <algorithm>
 #include <array>
 #include <cstdlib>
 #include <getopt.h>
@@ -34,6 +35,17 @@ outcome profile(const option_words& words) {
 
 outcome scm(const option_words& words) {
     scm_monitor(words.argument, words.all, words.index);
+    return outcome::done;
+}
+
+// The command takes the words before the next option, and leaves those aside that it does not need.
+outcome replay(const option_words& words) {
+    const auto further = words.all.subspan(static_cast<std::size_t>(words.index));
+    const auto end = std::find_if(further.begin(), further.end(),
+                                  [](std::string_view word) { return word.starts_with("--"); });
+    const auto own = words.all.first(static_cast<std::size_t>(end - words.all.begin()));
+    replay_command(words.argument, own, words.index);
+    words.index = static_cast<int>(own.size());
     return outcome::done;
 }
 
@@ -111,6 +123,9 @@ constexpr std::array option_rows{
                "control the profiler; the subcommand help lists the others", profile},
     option_row{"scm", true, "DURATION CONFIG...",
                "print the coprocessor's bus transfers for DURATION milliseconds, or auto", scm},
+    option_row{"replay", true, "SUBCOMMAND [WORD...]",
+               "play samples back in place of live ones; the subcommand help lists the others",
+               replay},
     option_row{"sensor", true, "NAME [LEVEL]",
                "print a sensor's configuration; at level 2 also its clients and state",
                show_sensor},

@@ -27,6 +27,9 @@
 #include "nrxctl/profiler/profile_command.h"
 #include "nrxctl/profiler/scm_monitor.h"
 
+// Replay of sensor samples
+#include "nrxctl/replay/replay_command.h"
+
 // Sensors
 #include "nrxctl/inspection/sensor_info.h"
 

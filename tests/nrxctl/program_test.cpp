@@ -3,9 +3,12 @@
 
 #include <algorithm>
 #include <chrono>
+#include <cstdio>
 #include <ctime>
+#include <fstream>
 #include <sstream>
 #include <thread>
+#include <unistd.h>
 
 #include <gtest/gtest.h>
 
@@ -47,6 +50,7 @@ TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
         {{"list"}, "unknown word list"},
         {{"--list", "more"}, "unknown word more"},
         {{"--profile"}, "a word is missing after --profile"},
+        {{"--replay"}, "a word is missing after --replay"},
         {{"--sensor"}, "a word is missing after --sensor"},
         {{"--sensor", "accel", "1", "2"}, "unknown word 2"},
         {{"--report", "accel"}, "a word is missing after --report"},
@@ -303,6 +307,33 @@ TEST(nrxctl_program, spi_status_interrupted_as_soon_as_it_begins_ends_all_the_sa
         EXPECT_EQ(watch.finish(), 0);
         EXPECT_TRUE(watch.out().ends_with("Found an id for service = 16\n"));
     }
+}
+
+TEST(nrxctl_program, generates_samples_and_plays_them_back) {
+    const auto generated = run({"--replay", "generate", "accel", "sin", "10000", "1hz"});
+    EXPECT_EQ(generated.status, 0);
+    EXPECT_EQ(lines_of(generated.out).size(), 100U);
+    const std::string path = testing::TempDir() + "walk-" + std::to_string(::getpid()) + ".txt";
+    std::ofstream(path) << generated.out;
+    // Words that a subcommand leaves aside do not reach the next option.
+    const auto loaded =
+        run({"--replay", "load", path, "last", "sram", "left", "--replay", "schedule-enable", "5",
+             "accel", "--replay", "get-status", "--replay", "load", path});
+    EXPECT_EQ(loaded.status, 0);
+    EXPECT_EQ(loaded.err, "");
+    EXPECT_EQ(loaded.out,
+              "accel: loaded 100 events\n"
+              "Replay status:\n"
+              "Service accel      is enabled\n"
+              "Service gyro       is inactive\n"
+              "Service compass    is inactive\n"
+              "Service pressure   is inactive\n"
+              "Service accel had already samples; you have to unload first\n");
+    std::ofstream(path) << "accel,shake=1,sampleid=1,temperature=2,x=3,y=4,z=5,timestamp=6\n";
+    const auto refused = run({"--replay", "load", path, "--replay", "get-status"});
+    EXPECT_EQ(refused.status, 1);
+    EXPECT_EQ(refused.out, "Shake samples are not allowed\n");
+    std::remove(path.c_str());
 }
 
 TEST(nrxctl_program, output_that_nobody_reads_ends_nothing) {

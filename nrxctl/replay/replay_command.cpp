@@ -1,0 +1,74 @@
+#include "nrxctl/replay/replay_command.h"
+
+#include <algorithm>
+#include <array>
+
+#include "nrxctl/base/argument_words.h"
+#include "nrxctl/base/output.h"
+#include "nrxctl/base/text_line.h"
+#include "nrxctl/replay/signal_request.h"
+#include "nrxctl/replay/subcommands.h"
+
+namespace nrx {
+
+namespace {
+
+constexpr std::array usage_lines{
+    "usage:",
+    "    nrxctl --replay load <file> <completion_policy: default|periodic|stop> "
+    "<location: sram|dram>",
+    "    nrxctl --replay unload <service...>",
+    "    nrxctl --replay schedule-enable <delay-seconds> <service...>",
+    "    nrxctl --replay enable <service...>",
+    "    nrxctl --replay disable <service...>",
+    "    nrxctl --replay get-status",
+    "    nrxctl --replay generate <service> <signal-type: random|delta|step|sin> <interval> "
+    "<num_samples|frequency_hz>",
+    "    nrxctl --replay help",
+};
+
+void help(argument_words& /*words*/) {
+    print_replay_usage();
+}
+
+void generate(argument_words& words) {
+    if (const auto request = read_signal_request(words)) generate_samples(*request);
+}
+
+struct subcommand_row {
+    std::string_view word;
+    void (*run)(argument_words& words);
+};
+
+constexpr std::array subcommands{
+    subcommand_row{"help", help},
+    subcommand_row{"load", replay::load},
+    subcommand_row{"unload", replay::unload},
+    subcommand_row{"schedule-enable", replay::schedule_enable},
+    subcommand_row{"enable", replay::enable},
+    subcommand_row{"disable", replay::disable},
+    subcommand_row{"get-status", replay::show_status},
+    subcommand_row{"generate", generate},
+};
+
+}  // namespace
+
+void print_replay_usage() {
+    for (const char* line : usage_lines)
+        print_line(line);
+}
+
+void replay_command(std::string_view subcommand, std::span<char* const> words, int& index) {
+    argument_words further(words, index);
+    const auto* row =
+        std::find_if(subcommands.begin(), subcommands.end(),
+                     [&](const subcommand_row& known) { return known.word == subcommand; });
+    if (row != subcommands.end()) {
+        row->run(further);
+        return;
+    }
+    print_line(text_line().text("Invalid subcommand ").text(subcommand).text("\n").view());
+    print_replay_usage();
+}
+
+}  // namespace nrx

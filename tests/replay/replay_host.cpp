@@ -1,0 +1,74 @@
+#include "tests/replay/replay_host.h"
+
+#include <cstdio>
+#include <cstdlib>
+#include <unistd.h>
+
+#include "nrxctl/replay/replay_command.h"
+#include "platform/virtual/replay_app.h"
+
+namespace tests {
+
+sample_text_file::sample_text_file(std::string_view text)
+    : path_(testing::TempDir() + "samples-XXXXXX") {
+    const int file = ::mkstemp(path_.data());
+    EXPECT_EQ(::write(file, text.data(), text.size()), static_cast<ssize_t>(text.size()));
+    ::close(file);
+}
+
+sample_text_file::~sample_text_file() {
+    ::unlink(path_.c_str());
+}
+
+interface_driver& put_replay_services(machine& host) {
+    put_service(host, "accel", 0x10);
+    put_service(host, "gyro", 0x11);
+    put_service(host, "compass", 0x12);
+    put_service(host, "pressure", 0x13);
+    interface_driver& service = put_service(host, "NRXApp", 0x51);
+    const auto app = std::make_shared<platform::simulated::replay_app>(
+        std::vector<platform::simulated::replay_service>{
+            {0x10, 28}, {0x11, 28}, {0x12, 28}, {0x13, 20}});
+    serve_replay(service, app);
+    host.add({.name = "client", .unit = make_replay_client(app)}, host.find("NRXApp"));
+    return service;
+}
+
+int run_replay(std::vector<std::string> words) {
+    std::vector<char*> argv;
+    for (std::string& word : words)
+        argv.push_back(word.data());
+    int index = 1;
+    nrx::replay_command(words[0], argv, index);
+    return index - 1;
+}
+
+outcome replay(const std::vector<std::string>& words, int* taken) {
+    int count = 0;
+    outcome written = capture([&] { count = run_replay(words); });
+    if (taken != nullptr) *taken = count;
+    return written;
+}
+
+void replay_test::SetUp() {
+    device_test::SetUp();
+    app = &put_replay_services(host);
+}
+
+std::vector<std::string> replay_test::calls() {
+    constexpr std::string_view no_outputs = " results 0 room 0";
+    std::vector<std::string> lines;
+    for (; seen_ < host.log().size(); ++seen_) {
+        std::string line = host.log()[seen_];
+        if (!line.starts_with("call ")) continue;
+        if (line.ends_with(no_outputs)) line.resize(line.size() - no_outputs.size());
+        lines.push_back(line);
+    }
+    return lines;
+}
+
+std::string failed(std::string_view file, std::string_view condition, std::string_view code) {
+    return failure_line("nrxtoollib", condition, "nrxctl/" + std::string(file), code);
+}
+
+}  // namespace tests

@@ -1,0 +1,53 @@
+// A host with the replay application and the services that play samples back, and files to load.
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "tests/support/device_test.h"
+
+namespace tests {
+
+// A file for as long as this object lives.
+class sample_text_file {
+public:
+    explicit sample_text_file(std::string_view text);
+    ~sample_text_file();
+    sample_text_file(const sample_text_file&) = delete;
+    sample_text_file& operator=(const sample_text_file&) = delete;
+
+    [[nodiscard]] const std::string& path() const { return path_; }
+
+private:
+    std::string path_;
+};
+
+// Registers accel (id 0x10), gyro (0x11), compass (0x12), pressure (0x13) and NRXApp (0x51) with
+// its client; the driver of NRXApp's reports. No service has samples.
+interface_driver& put_replay_services(machine& host);
+
+// Runs a subcommand as the command line gives it; how many further words it took.
+int run_replay(std::vector<std::string> words);
+
+// The same, with what it wrote; how many further words it took, if asked.
+outcome replay(const std::vector<std::string>& words, int* taken = nullptr);
+
+class replay_test : public device_test {
+protected:
+    void SetUp() override;
+
+    // The method calls since the last time, in the words of the log, without what they all end
+    // with.
+    std::vector<std::string> calls();
+
+    interface_driver* app = nullptr;
+
+private:
+    std::size_t seen_ = 0;
+};
+
+// A failure report of the library, from a file of its folder.
+std::string failed(std::string_view file, std::string_view condition, std::string_view code = "");
+
+}  // namespace tests
