@@ -1,0 +1,70 @@
+// The words behind "generate", one to a line. What they ask for is generated, up to a number of
+// samples, and each line reads back as the sample that it stands for.
+#include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <cstdlib>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "fuzz/support/harness.h"
+#include "nrxctl/base/little_endian.h"
+#include "nrxctl/replay/make_event.h"
+#include "nrxctl/replay/sample_line.h"
+#include "nrxctl/replay/signal_request.h"
+
+namespace {
+
+constexpr std::uint32_t most_samples = 64;
+
+// A NUL ends a word wherever it stands.
+std::vector<std::string> words_of(std::string_view text) {
+    std::vector<std::string> words;
+    while (!text.empty()) {
+        const std::size_t length = std::min(text.find('\n'), text.size());
+        words.emplace_back(std::string(text.substr(0, length)).c_str());
+        text.remove_prefix(std::min(length + 1, text.size()));
+    }
+    return words;
+}
+
+std::optional<nrx::signal_request> read(std::vector<std::string>& words) {
+    std::vector<char*> pointers;
+    for (std::string& word : words)
+        pointers.push_back(word.data());
+    int index = 0;
+    nrx::argument_words left(pointers, index);
+    std::optional<nrx::signal_request> request;
+    fuzz::completes([&] { request = nrx::read_signal_request(left); });
+    fuzz::require(!request || index == 4);
+    return request;
+}
+
+void check_line(const std::string& line, const nrx::signal_request& request, std::uint32_t number) {
+    nrx::sample_line split;
+    fuzz::require(nrx::split_sample_line(line, split) && split.tag == request.service);
+    const auto event = nrx::make_event(split.tag);
+    fuzz::require(fuzz::completes([&] { event->parse(split.values); }));
+    fuzz::require(nrx::load_le<std::uint32_t>(event->data() + 8) == number);
+    const auto value = nrx::load_le<std::int32_t>(event->data() + 16);
+    fuzz::require(value >= -0x10000 && value <= 0x10000);
+    // Time stamps of lines have 32 bits.
+    fuzz::require(static_cast<std::uint32_t>(event->timestamp()) == number * request.interval);
+}
+
+}  // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    auto words = words_of(fuzz::as_text(data, size));
+    auto request = read(words);
+    if (!request) return 0;
+    request->samples = std::min(request->samples, most_samples);
+    nrx::generate_samples(*request);
+    const auto event = nrx::make_event(request->service);
+    if (!event || !event->init_generator(request->signal_type)) return 0;
+    for (std::uint32_t i = 0; i < request->samples; ++i)
+        check_line(event->generate(request->signal_type, request->interval, request->samples),
+                   *request, i);
+    return 0;
+}
