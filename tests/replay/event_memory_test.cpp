@@ -44,7 +44,7 @@ TEST(event_memory, events_lie_side_by_side_and_apart) {
     }
     std::size_t neighbours = 0;
     for (std::size_t i = 1; i < many; ++i)
-        neighbours += events[i] == events[i - 1] + room ? 1 : 0;
+        neighbours += events[i] == events[i - 1] + room ? 1U : 0U;
     EXPECT_GE(neighbours, many - 1 - many * room / 2'000'000);
     for (std::uint8_t* event : events)
         give_back(event);
