@@ -16,11 +16,7 @@
 
 namespace {
 
-using tests::byte_list;
-using tests::failure;
-using tests::fault;
-using tests::is_told;
-using tests::sweep_faults;
+using namespace tests;
 
 // A driver of its own type, whose one method answers with a byte.
 class zumo_driver final : public platform::simulated::driver {
@@ -34,9 +30,9 @@ public:
     }
 };
 
-std::unique_ptr<tests::machine> make_host() {
-    auto host = std::make_unique<tests::machine>();
-    auto& accel = tests::put_service(*host, "accel", 31);
+std::unique_ptr<machine> make_host() {
+    auto host = std::make_unique<machine>();
+    auto& accel = put_service(*host, "accel", 31);
     accel.set_report(0xd0, {1, 2, 3});
     accel.set_command(0x20, [](platform::byte_view, byte_list& reply) {
         reply = {1};
@@ -44,7 +40,7 @@ std::unique_ptr<tests::machine> make_host() {
     });
     accel.set_named_property("gain", {1, 2});
     accel.set_scalar_method([](std::span<const std::uint64_t>) { return platform::success; });
-    auto& mca = tests::put_service(*host, "mca", 33);
+    auto& mca = put_service(*host, "mca", 33);
     for (const std::uint32_t command : {0x20U, 0x22U})
         mca.set_command(command, [](platform::byte_view, byte_list&) { return platform::success; });
     mca.set_report(0x16, {});
@@ -52,78 +48,57 @@ std::unique_ptr<tests::machine> make_host() {
     host->add({.name = "KeltoNRXHIDDriver",
                .properties = {{"LocationID", 1234}},
                .unit = std::make_shared<zumo_driver>()});
-    tests::put_service(*host, "profile", 32).set_report(0xd1, byte_list(96));
+    put_service(*host, "profile", 32).set_report(0xd1, byte_list(96));
     const auto app = host->add({.name = "NRXApp"});
-    host->add({.name = "client", .unit = std::make_shared<tests::interface_driver>()}, app);
+    host->add({.name = "client", .unit = std::make_shared<interface_driver>()}, app);
     host->add(
         {.name = "hid", .classes = {"KeltoNRXHIDDevice"}, .properties = {{"LocationID", 31}}});
     return host;
 }
 
-std::array<std::uint8_t, 16> buffer;
-
-TEST(base_fault_sweep, reports_of_the_command_channel) {
-    sweep_faults(
-        make_host,
-        [] {
-            platform::byte_span room = buffer;
-            nrx::get_report("accel", 0xd0, room);
-        },
-        is_told);
-    sweep_faults(
-        make_host, [] { nrx::set_report("accel", 0xd0, byte_list{1}); }, is_told);
-    sweep_faults(
-        make_host,
-        [] {
-            platform::byte_span room = buffer;
-            nrx::send_command("accel", 0x20, byte_list{1}, room);
-        },
-        is_told);
+// Room for a reply, whole at each call.
+platform::byte_span& room() {
+    static std::array<std::uint8_t, 16> buffer;
+    static platform::byte_span span;
+    return span = buffer;
 }
 
 TEST(base_fault_sweep, further_operations) {
+    const byte_list one{1};
     sweep_faults(
         make_host, [] { nrx::call_scalar_method("accel", {}); }, is_told);
     sweep_faults(
-        make_host, [] { nrx::set_named_property("accel", "gain", byte_list{3}); }, is_told);
+        make_host, [&] { nrx::set_named_property("accel", "gain", one); }, is_told);
     sweep_faults(
-        make_host,
-        [] {
-            platform::byte_span room = buffer;
-            nrx::get_named_property("accel", "gain", room);
-        },
-        is_told);
+        make_host, [] { nrx::get_named_property("accel", "gain", room()); }, is_told);
     sweep_faults(
-        make_host,
-        [] {
-            platform::byte_span room = buffer;
-            nrx::call_hid_driver(byte_list{1}, room);
-        },
-        is_told);
+        make_host, [&] { nrx::call_hid_driver(one, room()); }, is_told);
     for (const bool on : {true, false}) {
         sweep_faults(
             make_host, [&] { nrx::switch_mca(on); }, is_told);
     }
 }
 
-TEST(base_fault_sweep, probing_reports_a_failed_open_and_nothing_else) {
-    const auto only_the_open = [](const fault& one) {
-        return one.result.err.empty() != one.name.starts_with("open ");
-    };
+TEST(base_fault_sweep, reports_of_the_command_channel) {
+    const byte_list one{1};
+    sweep_faults(
+        make_host, [] { nrx::get_report("accel", 0xd0, room()); }, is_told);
+    sweep_faults(
+        make_host, [&] { nrx::set_report("accel", 0xd0, one); }, is_told);
+    sweep_faults(
+        make_host, [&] { nrx::send_command("accel", 0x20, one, room()); }, is_told);
+    // Probing reports a failed open and nothing else.
+    sweep_faults(
+        make_host, [] { nrx::get_report_quiet("accel", 0xd0, room()); },
+        [](const fault& fault) {
+            return fault.result.err.empty() != fault.name.starts_with("open ");
+        });
     sweep_faults(
         make_host,
-        [] {
-            platform::byte_span room = buffer;
-            nrx::get_report_quiet("accel", 0xd0, room);
-        },
-        only_the_open);
-    sweep_faults(
-        make_host,
-        [] {
-            platform::byte_span room = buffer;
-            nrx::send_command("31", 0x20, byte_list{1}, room, nrx::command_failure::is_silent);
-        },
-        [](const fault& one) { return one.result.err.empty() == one.name.starts_with("call "); });
+        [&] { nrx::send_command("31", 0x20, one, room(), nrx::command_failure::is_silent); },
+        [](const fault& fault) {
+            return fault.result.err.empty() == fault.name.starts_with("call ");
+        });
 }
 
 TEST(base_fault_sweep, connections_and_records) {

@@ -1,5 +1,6 @@
 // Numbers and payloads as users type them.
 #include <limits>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -8,68 +9,44 @@
 #include "nrxctl/base/numbers.h"
 #include "nrxctl/base/payload.h"
 #include "tests/support/capture.h"
+#include "tests/support/word_vector.h"
 
 namespace {
 
-using tests::capture;
+using namespace tests;
 
 TEST(parse_number, reads_decimal_and_prefixed_hexadecimal) {
-    const std::vector<std::pair<const char*, std::int64_t>> rows{
-        {"0", 0},
-        {"7", 7},
-        {"+7", 7},
-        {"-7", -7},
-        {"007", 7},
-        {"0x1f", 31},
-        {"-0x10", -16},
-        {"+0xAb", 171},
-        {"0x0", 0},
-        {"0x0123456789abcdEF", 0x0123456789abcdef},
-        {"999999999999999", 999999999999999},
-        {"1000000000000000", 1000000000000000},
-        {"0xfffffffffffffff", 0xfffffffffffffff},
-        {"9223372036854775807", std::numeric_limits<std::int64_t>::max()},
-        {"-9223372036854775807", -std::numeric_limits<std::int64_t>::max()},
-        {"0x7fffffffffffffff", std::numeric_limits<std::int64_t>::max()},
-    };
+    constexpr auto largest = std::numeric_limits<std::int64_t>::max();
+    const std::map<std::string, std::int64_t> rows{{"0", 0},
+                                                   {"7", 7},
+                                                   {"+7", 7},
+                                                   {"-7", -7},
+                                                   {"007", 7},
+                                                   {"0x1f", 31},
+                                                   {"-0x10", -16},
+                                                   {"+0xAb", 171},
+                                                   {"0x0", 0},
+                                                   {"0x0123456789abcdEF", 0x0123456789abcdef},
+                                                   {"999999999999999", 999999999999999},
+                                                   {"1000000000000000", 1000000000000000},
+                                                   {"0xfffffffffffffff", 0xfffffffffffffff},
+                                                   {"9223372036854775807", largest},
+                                                   {"-9223372036854775807", -largest},
+                                                   {"0x7fffffffffffffff", largest}};
     for (const auto& [word, value] : rows)
         EXPECT_EQ(nrx::parse_number(word, "bad"), value) << word;
 }
 
 TEST(parse_number, ends_the_process_with_the_message_and_the_word) {
-    for (const char* word : {"",
-                             "12a",
-                             "a",
-                             "-",
-                             "+",
-                             "--5",
-                             "+-5",
-                             "- 5",
-                             " 5",
-                             "5 ",
-                             "1.5",
-                             "0x",
-                             "-0x",
-                             "0X1f",
-                             "0x1g",
-                             "0x-1",
-                             "0x 1",
-                             "x1",
-                             "12345678901234g",
-                             "12345678901234567a",
-                             "\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff",
-                             "5:",
-                             "5/",
-                             "0x5G",
-                             "0x5@",
-                             "0x5`",
-                             "9223372036854775808",
-                             "-9223372036854775808",
-                             "0x8000000000000000",
-                             "0x10000000000000000"}) {
+    for (const std::string& word : between_commas(
+             ",12a,a,-,+,--5,+-5,- 5, 5,5 ,1.5,0x,-0x,0X1f,0x1g,0x-1,0x "
+             "1,x1,5:,5/,0x5G,0x5@,0x5`,12345678901234g,"
+             "12345678901234567a,\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff,"
+             "9223372036854775808,"
+             "-9223372036854775808,0x8000000000000000,0x10000000000000000")) {
         const auto refused = capture([&] { nrx::parse_number(word, "duration is invalid"); });
         EXPECT_EQ(refused.status, 1) << word;
-        EXPECT_EQ(refused.out, "duration is invalid (" + std::string(word) + ")\n");
+        EXPECT_EQ(refused.out, "duration is invalid (" + word + ")\n");
         EXPECT_EQ(refused.err, "");
     }
 }
@@ -80,11 +57,9 @@ struct packed {
 };
 
 packed pack(std::vector<std::string> words, int position = 0) {
-    std::vector<char*> pointers;
-    for (std::string& word : words)
-        pointers.push_back(word.data());
+    const word_vector all(std::move(words));
     packed result{position, {0xee}};
-    nrx::parse_payload(pointers, result.position, result.payload);
+    nrx::parse_payload(all.all(), result.position, result.payload);
     return result;
 }
 

@@ -8,8 +8,6 @@
 
 #include <gtest/gtest.h>
 
-#include "tests/support/capture.h"
-
 namespace {
 
 // Sends standard output to a descriptor for as long as it lives.
@@ -52,16 +50,6 @@ TEST(output, arrives_whole_through_a_pipe_that_has_little_room_and_does_not_wait
     reader.join();
     ::close(ends[0]);
     EXPECT_EQ(received == sent, true);
-}
-
-TEST(output, that_cannot_be_written_is_dropped) {
-    const int full = ::open("/dev/full", O_WRONLY | O_CLOEXEC);
-    {
-        const output_to_descriptor redirected(full);
-        nrx::print_line("lost");
-    }
-    ::close(full);
-    EXPECT_EQ(tests::capture([] { nrx::print_line("seen"); }).out, "seen\n");
 }
 
 }  // namespace

@@ -4,17 +4,26 @@
 
 namespace {
 
-using tests::capture;
-using tests::failure;
-using tests::failure_line;
+using namespace tests;
 
-constexpr const char* source = "nrxctl/base/service_conn.cpp";
-
-class service_conn : public tests::device_test {
+class service_conn : public device_test {
 protected:
     void put_app() {
         const auto app = host.add({.name = "NRXApp", .classes = {"Anything"}});
-        host.add({.name = "client", .unit = std::make_shared<tests::interface_driver>()}, app);
+        host.add({.name = "client", .unit = std::make_shared<interface_driver>()}, app);
+    }
+
+    // What is reported when a connection cannot be opened, and how much it still holds then.
+    std::string failing(bool quiet, std::size_t held) {
+        return capture([&] {
+                   nrx::service_conn conn("NRXApp");
+                   EXPECT_FALSE(conn.open(quiet));
+                   EXPECT_EQ(host.open_handles(), held);
+               })
+            .err;
+    }
+    static std::string failed(std::string_view condition, std::string_view code = "") {
+        return failure_line("nrxtoollib", condition, "nrxctl/base/service_conn.cpp", code);
     }
 };
 
@@ -33,33 +42,18 @@ TEST_F(service_conn, opens_the_first_child_of_a_service_of_any_class_and_gives_a
                                         "close client", "release client", "release NRXApp"}));
 }
 
-TEST_F(service_conn, does_not_try_the_prefix) {
+TEST_F(service_conn, reports_what_fails_and_is_quiet_only_about_a_missing_service) {
     host.add({.name = "WQR_NRXApp"});
-    const auto result = capture([] { EXPECT_FALSE(nrx::service_conn("NRXApp").open(false)); });
-    EXPECT_EQ(result.err, failure_line("nrxtoollib", "service", source));
-}
-
-TEST_F(service_conn, is_quiet_only_about_a_missing_service) {
-    EXPECT_EQ(capture([] { EXPECT_FALSE(nrx::service_conn("NRXApp").open(true)); }).err, "");
+    EXPECT_EQ(failing(false, 0), failed("service"));
+    EXPECT_EQ(failing(true, 0), "");
     host.add({.name = "NRXApp"});
-    const auto result = capture([] { EXPECT_FALSE(nrx::service_conn("NRXApp").open(true)); });
-    EXPECT_EQ(result.err, failure_line("nrxtoollib", "child", source));
-}
-
-TEST_F(service_conn, reports_a_failed_open_and_keeps_what_it_found_until_the_end) {
+    EXPECT_EQ(failing(true, 1), failed("child"));
+    host.remove("NRXApp");
     put_app();
     host.fail_call(3, failure::no_memory);
-    const auto result = capture([&] {
-        nrx::service_conn conn("NRXApp");
-        EXPECT_FALSE(conn.open(false));
-        EXPECT_EQ(host.open_handles(), 2U);
-    });
-    EXPECT_EQ(result.err,
-              failure_line("nrxtoollib", "kr == 0 ", source, "out of memory (0xe00002bd)"));
+    EXPECT_EQ(failing(true, 2), failed("kr == 0 ", no_memory_text));
     host.fail_call(3, failure::nothing);
-    const auto unconnected =
-        capture([&] { EXPECT_FALSE(nrx::service_conn("NRXApp").open(false)); });
-    EXPECT_EQ(unconnected.err, failure_line("nrxtoollib", "connect", source));
+    EXPECT_EQ(failing(false, 2), failed("connect"));
 }
 
 }  // namespace

@@ -5,21 +5,21 @@
 
 namespace {
 
-using tests::capture;
-using tests::failure;
-using tests::put_service;
+using namespace tests;
 
-constexpr const char* source = "nrxctl/base/service_discovery.cpp";
+std::string failed(std::string_view condition, std::string_view code = "") {
+    return failure_line("nrxtoollib", condition, "nrxctl/base/service_discovery.cpp", code);
+}
 
-class service_discovery : public tests::device_test {
+class service_discovery : public device_test {
 protected:
-    // The registry name of the service that a name finds; empty if none.
-    static std::string found(std::string_view name) {
-        const platform::service service = nrx::find_service(name);
-        std::string entry_name;
-        if (service) platform::entry_name(service, entry_name);
-        return entry_name;
+    // The registry name of what was found; empty if nothing was.
+    static std::string name_of(const platform::service& service) {
+        std::string name;
+        if (service) platform::entry_name(service, name);
+        return name;
     }
+    static std::string found(std::string_view name) { return name_of(nrx::find_service(name)); }
 
     void put_hid_device(std::string_view name, std::int32_t location) {
         host.add({.name = std::string(name),
@@ -28,50 +28,36 @@ protected:
     }
 };
 
-TEST_F(service_discovery, finds_a_service_by_its_id_in_either_base) {
+TEST_F(service_discovery, finds_a_service_by_its_id_and_takes_anything_but_digits_as_a_name) {
+    host.add({.name = "no interface", .classes = {"Other"}, .properties = {{"service_id", 31}}});
+    put_service(host, "zero", 0);
     put_service(host, "accel", 31);
     put_service(host, "gyro", 32);
-    EXPECT_EQ(found("31"), "accel");
-    EXPECT_EQ(found("0x1f"), "accel");
-    EXPECT_EQ(found("0x20"), "gyro");
-    EXPECT_EQ(found("0031"), "accel");
-    EXPECT_EQ(found("33"), "");
-}
-
-TEST_F(service_discovery, takes_anything_but_digits_as_a_registry_name) {
-    put_service(host, "accel", 31);
     put_service(host, "0X1f", 5);
     put_service(host, "-31", 6);
-    EXPECT_EQ(found("0X1f"), "0X1f");
-    EXPECT_EQ(found("-31"), "-31");
-    EXPECT_EQ(found("Accel"), "");
+    const std::vector<std::pair<const char*, const char*>> rows{
+        {"31", "accel"}, {"0x1f", "accel"}, {"0x20", "gyro"},     {"0031", "accel"},
+        {"33", ""},      {"0X1f", "0X1f"},  {"-31", "-31"},       {"Accel", ""},
+        {"0", "zero"},   {"0x0", "zero"},   {"no interface", ""},
+    };
+    for (const auto& [name, service] : rows)
+        EXPECT_EQ(found(name), service) << name;
 }
 
-TEST_F(service_discovery, prefers_the_prefixed_name) {
+TEST_F(service_discovery, prefers_the_prefixed_name_and_cuts_it_alone_at_127_characters) {
     put_service(host, "wqr-button", 1);
     put_service(host, "WQR_wqr-button", 2);
     EXPECT_EQ(found("wqr-button"), "WQR_wqr-button");
     host.remove("WQR_wqr-button");
     EXPECT_EQ(found("wqr-button"), "wqr-button");
-}
-
-TEST_F(service_discovery, sees_interface_services_only) {
-    host.add({.name = "accel", .classes = {"Other"}, .properties = {{"service_id", 31}}});
-    EXPECT_EQ(found("accel"), "");
-    EXPECT_EQ(found("31"), "");
-}
-
-TEST_F(service_discovery, cuts_only_the_prefixed_name_at_127_characters) {
     const std::string name(200, 'n');
-    const platform::service none = nrx::find_service(name);
-    EXPECT_FALSE(none);
-    EXPECT_EQ(host.log().at(0),
-              "first match {IOProviderClass = \"KeltoNRXInterface\"; "
-              "IONameMatch = \"WQR_" +
-                  std::string(123, 'n') + "\"}");
-    EXPECT_EQ(
-        host.log().at(1),
-        "first match {IOProviderClass = \"KeltoNRXInterface\"; IONameMatch = \"" + name + "\"}");
+    EXPECT_EQ(found(name), "");
+    const auto asked = [](const std::string& wanted) {
+        return "first match {IOProviderClass = \"KeltoNRXInterface\"; IONameMatch = \"" + wanted +
+               "\"}";
+    };
+    EXPECT_EQ(host.log().end()[-2], asked("WQR_" + std::string(123, 'n')));
+    EXPECT_EQ(host.log().back(), asked(name));
 }
 
 TEST_F(service_discovery, an_id_that_is_none_finds_nothing) {
@@ -87,8 +73,6 @@ TEST_F(service_discovery, an_id_that_is_none_finds_nothing) {
         EXPECT_EQ(result.err, "") << name;
         EXPECT_EQ(id, 77);
     }
-    EXPECT_EQ(found("0"), "zero");
-    EXPECT_EQ(found("0x0"), "zero");
 }
 
 TEST_F(service_discovery, says_when_a_service_does_not_exist) {
@@ -100,32 +84,21 @@ TEST_F(service_discovery, says_when_a_service_does_not_exist) {
 }
 
 TEST_F(service_discovery, finds_the_hid_device_at_the_service_id) {
-    put_service(host, "WQR_button", 9);
-    put_hid_device("other", 8);
-    put_hid_device("button", 9);
-    for (const char* name : {"button", "9", "0x9"}) {
-        const platform::service device = nrx::find_hid_device(name);
-        std::string entry_name;
-        ASSERT_EQ(platform::entry_name(device, entry_name), platform::success) << name;
-        EXPECT_EQ(entry_name, "button") << name;
-    }
-    EXPECT_FALSE(nrx::find_hid_device("10"));
-}
-
-TEST_F(service_discovery, reports_a_missing_interface_of_a_hid_device) {
-    const auto result = capture([] { EXPECT_FALSE(nrx::find_hid_device("button")); });
-    EXPECT_EQ(result.err, tests::failure_line("nrxtoollib", "nrx_interface", source));
-}
-
-TEST_F(service_discovery, an_interface_without_an_id_has_neither_hid_device_nor_id) {
-    host.add({.name = "bare", .classes = {"KeltoNRXInterface"}});
     put_hid_device("zero", 0);
+    put_hid_device("button", 9);
+    EXPECT_EQ(capture([] { EXPECT_FALSE(nrx::find_hid_device("button")); }).err,
+              failed("nrx_interface"));
+    put_service(host, "WQR_button", 9);
+    for (const char* name : {"button", "9", "0x9"})
+        EXPECT_EQ(name_of(nrx::find_hid_device(name)), "button") << name;
+    EXPECT_FALSE(nrx::find_hid_device("10"));
+    host.add({.name = "bare", .classes = {"KeltoNRXInterface"}});
     std::int32_t id = 77;
-    const auto result = capture([&] {
+    const auto without_id = capture([&] {
         EXPECT_FALSE(nrx::find_hid_device("bare"));
         EXPECT_FALSE(nrx::resolve_service_id("bare", id));
     });
-    EXPECT_EQ(result.err, "");
+    EXPECT_EQ(without_id.err, "");
     EXPECT_EQ(id, 77);
 }
 
@@ -139,29 +112,24 @@ TEST_F(service_discovery, resolves_numbers_without_asking_and_names_by_their_ser
     EXPECT_EQ(host.calls_made(), 0U);
     EXPECT_TRUE(nrx::resolve_service_id("accel", id));
     EXPECT_EQ(id, -4);
-    const auto result = capture([&] { EXPECT_FALSE(nrx::resolve_service_id("nope", id)); });
-    EXPECT_EQ(result.err,
-              tests::failure_line("nrxtoollib", "service != ((io_object_t) 0)", source));
+    EXPECT_EQ(capture([&] { EXPECT_FALSE(nrx::resolve_service_id("nope", id)); }).err,
+              failed("service != ((io_object_t) 0)"));
 }
 
 TEST_F(service_discovery, names_the_service_of_an_id) {
     put_service(host, "accel", 31);
-    std::string name = "untouched";
     put_service(host, "below", -4);
+    std::string name;
     EXPECT_TRUE(nrx::service_name_for_id(31, name));
     EXPECT_EQ(name, "accel");
     EXPECT_TRUE(nrx::service_name_for_id(-4, name));
     EXPECT_EQ(name, "below");
-
-    name = "untouched";
-    const auto missing = capture([&] { EXPECT_FALSE(nrx::service_name_for_id(5, name)); });
-    EXPECT_EQ(missing.err,
-              tests::failure_line("nrxtoollib", "service != ((io_object_t) 0)", source));
+    EXPECT_EQ(capture([&] { EXPECT_FALSE(nrx::service_name_for_id(5, name)); }).err,
+              failed("service != ((io_object_t) 0)"));
     host.fail_call(2, failure::io);
-    const auto nameless = capture([&] { EXPECT_FALSE(nrx::service_name_for_id(31, name)); });
-    EXPECT_EQ(nameless.err, tests::failure_line("nrxtoollib", "kr == 0 ", source,
-                                                "device i/o failure (0xe0000401)"));
-    EXPECT_EQ(name, "untouched");
+    EXPECT_EQ(capture([&] { EXPECT_FALSE(nrx::service_name_for_id(31, name)); }).err,
+              failed("kr == 0 ", io_text));
+    EXPECT_EQ(name, "below");
 }
 
 TEST(matching, builds_what_the_lookups_are_made_with) {

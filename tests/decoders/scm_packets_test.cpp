@@ -11,9 +11,8 @@
 
 namespace {
 
+using namespace tests;
 using nrx::profile_record;
-using tests::capture;
-using tests::record_of;
 
 profile_record at_time(profile_record record, std::uint8_t timestamp) {
     std::fill_n(record.bytes.begin() + 8, 8, std::uint8_t{0});
@@ -43,14 +42,11 @@ private:
 };
 
 TEST_F(scm_packets, a_transfer_names_bus_event_direction_and_both_times) {
-    EXPECT_EQ(print(transfer(3, 12, 0, 5)),
-              "i2cm0.12: scm_read wqr_timestamp=5 scm_timestamp=78187493530\n");
-    EXPECT_EQ(print(transfer(0, 0, 1, 5)),
-              "spi0.0: scm_write wqr_timestamp=5 scm_timestamp=78187493530\n");
-    const char* const buses[] = {"spi0", "smb0", "smb1", "i2cm0", "i2c_ctrl0", "i2c_ctrl1"};
-    for (std::uint8_t bus = 0; bus < 6; ++bus) {
-        EXPECT_TRUE(
-            print(transfer(bus, 255, 1, 5)).starts_with(std::string(buses[bus]) + ".255: "));
+    const std::vector<std::string> buses{"spi0", "smb0", "smb1", "i2cm0", "i2c_ctrl0", "i2c_ctrl1"};
+    for (std::uint8_t bus = 0; bus < buses.size(); ++bus) {
+        const std::string times = " wqr_timestamp=5 scm_timestamp=78187493530\n";
+        EXPECT_EQ(print(transfer(bus, 12, 0, 5)), buses[bus] + ".12: scm_read" + times);
+        EXPECT_EQ(print(transfer(bus, 255, 1, 5)), buses[bus] + ".255: scm_write" + times);
     }
     auto late = record_of({9, 0, 0, 3}, {{20, 8, 18446744073709551615U}});
     late.bytes[15] = 0x80;
@@ -118,12 +114,10 @@ TEST(profile_hexdump, puts_a_blank_behind_each_byte_only_if_spaced_is_1) {
 }
 
 TEST(profile_hexdump, of_a_record_has_96_digits) {
-    auto record = record_of({0, 0, 0, 0});
-    EXPECT_EQ(capture([&] { nrx::dump_profile_record(record); }).out,
+    EXPECT_EQ(capture([] {
+                  nrx::dump_profile_record(record_of({0, 0, 0, 0}));
+              }).out,
               "prof-event 000000002a000000bb1f000000000000" + std::string(64, '0') + "\n");
-    record.bytes.fill(0);
-    EXPECT_EQ(capture([&] { nrx::dump_profile_record(record); }).out,
-              "prof-event " + std::string(96, '0') + "\n");
 }
 
 TEST(profile_hexdump, stops_the_process_if_the_line_would_not_fit) {

@@ -29,6 +29,10 @@ button_host put_button_services(machine& host) {
     return services;
 }
 
+std::string whole_text() {
+    return stats_text() + diagnostics_text() + assets_text() + features_text();
+}
+
 std::string stats_text() {
     const auto click = [](const std::string& number) {
         return "--Click " + number +
@@ -67,28 +71,14 @@ std::string diagnostics_text() {
 }
 
 std::string assets_text() {
-    const std::string names[] = {"SingleDown",
-                                 "SingleUp",
-                                 "DoubleDown",
-                                 "DoubleUp",
-                                 "TripleDown",
-                                 "TripleUp",
-                                 "SingleTapOn",
-                                 "SingleTapOff",
-                                 "DoubleTapOn",
-                                 "DoubleTapOff",
-                                 "TripleTapOn",
-                                 "TripleTapOff",
-                                 "DeepDown",
-                                 "DeepUp",
-                                 "LongPress",
-                                 "LongPressUp",
-                                 ""};
     std::string text =
         "==========keyprobe wqr-button get-assets==============\n"
         "Length: 1, expected 1479\n";
     for (const std::string speed : {"Slow", "Medium", "Fast"}) {
-        for (const std::string& name : names) {
+        for (const std::string name :
+             {"SingleDown", "SingleUp", "DoubleDown", "DoubleUp", "TripleDown", "TripleUp",
+              "SingleTapOn", "SingleTapOff", "DoubleTapOn", "DoubleTapOff", "TripleTapOn",
+              "TripleTapOff", "DeepDown", "DeepUp", "LongPress", "LongPressUp", ""}) {
             text += "ASSET [" + speed + "][" + name + "]: enable 0, slot 0, gain 0, min 0, max 0\n";
         }
     }

@@ -19,7 +19,8 @@ struct button_host {
 // (two bytes) and the feature report 0xb4 (none).
 button_host put_button_services(machine& host);
 
-// What the steps of the collection print on that host.
+// What the collection prints on that host, and its steps.
+std::string whole_text();
 std::string stats_text();
 std::string diagnostics_text();
 std::string assets_text();

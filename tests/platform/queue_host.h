@@ -29,42 +29,29 @@ public:
     std::shared_ptr<platform::simulated::shared_queue> queue;
 };
 
-// A queue whose driver adds an entry of one byte every 10 ms, and has nothing more to say after
-// that many entries.
-class ticking_queue final : public platform::simulated::shared_queue {
-public:
-    ticking_queue(const platform::simulated::machine_clock& clock, int entries)
-        : clock_(clock), entries_left_(entries) {}
-
-    void catch_up() override {
-        while (entries_left_ > 0 && clock_.now() >= next_) {
-            add({static_cast<std::uint8_t>(next_.count() / 10'000'000)});
-            next_ += std::chrono::milliseconds(10);
-            --entries_left_;
-        }
-    }
-    [[nodiscard]] std::optional<platform::simulated::machine_clock::time> next_due()
-        const override {
-        return entries_left_ > 0 ? std::optional(next_) : std::nullopt;
-    }
-
-private:
-    const platform::simulated::machine_clock& clock_;
-    int entries_left_;
-    platform::simulated::machine_clock::time next_ = std::chrono::milliseconds(10);
-};
-
 // A queue, mapped and with a port attached to it, on a host of its own.
 class queue_test : public device_test {
 protected:
-    // Registers the driver of a queue as "streamer" and connects to it.
+    // A plain queue, streamed.
+    platform::simulated::shared_queue& stream() {
+        const auto shared = std::make_shared<platform::simulated::shared_queue>();
+        stream(shared);
+        return *shared;
+    }
+
+    // Registers the driver of a queue as "streamer", which keeps it, and connects to it.
     void stream(std::shared_ptr<platform::simulated::shared_queue> shared) {
         host.add({.name = "streamer", .unit = std::make_shared<queue_driver>(std::move(shared))});
-        const auto service = platform::first_match({{"IONameMatch", "streamer"}});
+        connect("streamer", 3, 5);
+    }
+
+    // Connects to a driver and its queue.
+    void connect(std::string_view name, std::uint32_t memory, std::uint32_t notification) {
+        const auto service = platform::first_match({{"IONameMatch", name}});
         ASSERT_EQ(platform::open(service, 0, connection), platform::success);
-        ASSERT_EQ(platform::map_memory(connection, 3, queue), platform::success);
+        ASSERT_EQ(platform::map_memory(connection, memory, queue), platform::success);
         port = platform::allocate_port();
-        ASSERT_EQ(platform::attach_port(connection, 5, port, 0), platform::success);
+        ASSERT_EQ(platform::attach_port(connection, notification, port, 0), platform::success);
     }
 
     void TearDown() override {

@@ -6,6 +6,7 @@
 
 namespace {
 
+using namespace tests;
 using platform::array;
 using platform::dictionary;
 using platform::first_child;
@@ -13,7 +14,6 @@ using platform::first_match;
 using platform::matching_class;
 using platform::property;
 using platform::service;
-using tests::interface_driver;
 
 dictionary usage(std::int32_t page, std::int32_t code) {
     return {{"DeviceUsagePage", page}, {"DeviceUsage", code}};
@@ -23,106 +23,104 @@ dictionary with_usage(std::int32_t page, std::int32_t code) {
     return {{"DeviceUsagePairs", array{usage(page, code)}}};
 }
 
+dictionary with(const property& properties) {
+    return {{"IOPropertyMatch", properties}};
+}
+
 // Two interface services, the second with a HID device below it.
-class registry : public tests::device_test {
+class registry : public device_test {
 protected:
     void SetUp() override {
         device_test::SetUp();
-        host.add({.name = "accel",
-                  .classes = {"interface", "base"},
-                  .properties = {{"service_id", 7}, {"rate", 100}},
-                  .unit = std::make_shared<interface_driver>()});
-        const auto gyro = host.add({.name = "gyro",
-                                    .classes = {"interface", "base"},
-                                    .properties = {{"service_id", 8}, {"rate", 100}},
-                                    .unit = std::make_shared<interface_driver>()});
+        put("accel", 7);
         host.add({.name = "gyro-hid",
                   .classes = {"hid", "base"},
                   .properties = {{"LocationID", std::int64_t{8}},
                                  {"DeviceUsagePairs", array{usage(0x20, 0x76), usage(1, 2)}}},
                   .hid = std::make_shared<platform::simulated::hid_unit>()},
-                 gyro);
+                 put("gyro", 8));
+    }
+
+    platform::simulated::entry_ref put(const char* name, std::int32_t id) {
+        return host.add({.name = name,
+                         .classes = {"interface", "base"},
+                         .properties = {{"service_id", id}, {"rate", 100}},
+                         .unit = std::make_shared<interface_driver>()});
     }
 
     static std::string matched(const dictionary& matching) {
+        return name_of(first_match(matching));
+    }
+    static std::string name_of(const service& entry) {
         std::string name;
-        return entry_name(first_match(matching), name) == platform::success ? name : "none";
+        return platform::entry_name(entry, name) == platform::success ? name : "none";
     }
 };
 
-TEST_F(registry, the_first_match_in_registration_order_comes_back) {
+TEST_F(registry, the_first_match_in_registration_order_comes_back_and_names_have_127_characters) {
     EXPECT_EQ(matched({}), "accel");
-    EXPECT_EQ(matched({{"IOPropertyMatch", dictionary{{"rate", 100}}}}), "accel");
+    EXPECT_EQ(matched(with(dictionary{{"rate", 100}})), "accel");
     host.remove("accel");
     EXPECT_EQ(matched({}), "gyro");
-    EXPECT_EQ(matched({{"IOPropertyMatch", dictionary{{"rate", 100}}}}), "gyro");
+    EXPECT_EQ(matched(matching_class("base")), "gyro");
+    host.add({.name = std::string(127, 'x') + "yz", .classes = {"long"}});
+    EXPECT_EQ(matched(matching_class("long")), std::string(127, 'x'));
 }
 
-TEST_F(registry, matches_an_entry_by_its_class_and_by_a_base_of_it) {
-    EXPECT_EQ(matched(matching_class("interface")), "accel");
-    EXPECT_EQ(matched(matching_class("hid")), "gyro-hid");
-    EXPECT_EQ(matched(matching_class("base")), "accel");
-    EXPECT_EQ(matched(matching_class("Interface")), "none");
-    EXPECT_EQ(matched(matching_class("")), "none");
-    EXPECT_EQ(matched({{"IOProviderClass", 1}}), "none");
-}
-
-TEST_F(registry, matches_an_entry_by_its_whole_name) {
-    EXPECT_EQ(matched({{"IONameMatch", "gyro"}}), "gyro");
-    EXPECT_EQ(matched({{"IONameMatch", "gyro-hid"}}), "gyro-hid");
-    EXPECT_EQ(matched({{"IONameMatch", "gyr"}}), "none");
-    EXPECT_EQ(matched({{"IONameMatch", 8}}), "none");
-}
-
-TEST_F(registry, matches_an_entry_by_all_of_the_given_properties) {
-    EXPECT_EQ(matched({{"IOPropertyMatch", dictionary{{"service_id", std::int64_t{8}}}}}), "gyro");
-    EXPECT_EQ(matched({{"IOPropertyMatch", dictionary{{"rate", 100}, {"service_id", 8}}}}), "gyro");
-    EXPECT_EQ(matched({{"IOPropertyMatch", dictionary{{"rate", 99}, {"service_id", 8}}}}), "none");
-    EXPECT_EQ(matched({{"IOPropertyMatch", dictionary{{"absent", 8}}}}), "none");
-    EXPECT_EQ(matched({{"IOPropertyMatch", 8}}), "none");
-}
-
-TEST_F(registry, matches_a_device_by_location_and_by_any_usage_in_common) {
-    EXPECT_EQ(matched({{"LocationID", 8}}), "gyro-hid");
-    EXPECT_EQ(matched({{"LocationID", 7}}), "none");
-    EXPECT_EQ(matched(with_usage(0x20, 0x76)), "gyro-hid");
-    EXPECT_EQ(matched(with_usage(1, 2)), "gyro-hid");
-    EXPECT_EQ(matched(with_usage(0x20, 2)), "none");
-    EXPECT_EQ(matched({{"DeviceUsagePairs", array{usage(9, 9), usage(1, 2)}}}), "gyro-hid");
-    EXPECT_EQ(matched({{"DeviceUsagePairs", array{}}}), "none");
-    EXPECT_EQ(matched({{"DeviceUsagePairs", usage(1, 2)}}), "none");
-}
-
-TEST_F(registry, all_keys_must_match_and_an_unknown_one_matches_nothing) {
-    dictionary matching = with_usage(1, 2);
-    matching.set("IOProviderClass", "hid");
-    EXPECT_EQ(matched(matching), "gyro-hid");
-    matching.set("IOProviderClass", "interface");
-    EXPECT_EQ(matched(matching), "none");
-    EXPECT_EQ(matched({{"service_id", 7}}), "none");
-    EXPECT_EQ(matched({{"IONameMatch", "gyro"}, {"Anything", 1}}), "none");
+TEST_F(registry, an_entry_matches_if_every_key_holds) {
+    dictionary usage_and_class = with_usage(1, 2);
+    usage_and_class.set("IOProviderClass", "hid");
+    dictionary usage_of_another_class = with_usage(1, 2);
+    usage_of_another_class.set("IOProviderClass", "interface");
+    const std::vector<std::pair<dictionary, std::string>> rows{
+        // class, or a base of it
+        {matching_class("interface"), "accel"},
+        {matching_class("hid"), "gyro-hid"},
+        {matching_class("base"), "accel"},
+        {matching_class("Interface"), "none"},
+        {matching_class(""), "none"},
+        {{{"IOProviderClass", 1}}, "none"},
+        // whole name
+        {{{"IONameMatch", "gyro"}}, "gyro"},
+        {{{"IONameMatch", "gyr"}}, "none"},
+        {{{"IONameMatch", 8}}, "none"},
+        // all properties
+        {with(dictionary{{"service_id", std::int64_t{8}}}), "gyro"},
+        {with(dictionary{{"rate", 100}, {"service_id", 8}}), "gyro"},
+        {with(dictionary{{"rate", 99}, {"service_id", 8}}), "none"},
+        {with(dictionary{{"absent", 8}}), "none"},
+        {with(8), "none"},
+        // location, and any usage in common
+        {{{"LocationID", 8}}, "gyro-hid"},
+        {{{"LocationID", 7}}, "none"},
+        {with_usage(0x20, 0x76), "gyro-hid"},
+        {with_usage(1, 2), "gyro-hid"},
+        {with_usage(0x20, 2), "none"},
+        {{{"DeviceUsagePairs", array{usage(9, 9), usage(1, 2)}}}, "gyro-hid"},
+        {{{"DeviceUsagePairs", array{}}}, "none"},
+        {{{"DeviceUsagePairs", usage(1, 2)}}, "none"},
+        // more than one key, and unknown ones
+        {usage_and_class, "gyro-hid"},
+        {usage_of_another_class, "none"},
+        {{{"service_id", 7}}, "none"},
+        {{{"IONameMatch", "gyro"}, {"Anything", 1}}, "none"},
+    };
+    for (const auto& [matching, name] : rows)
+        EXPECT_EQ(matched(matching), name) << platform::describe(matching);
 }
 
 TEST_F(registry, the_first_child_that_is_there_comes_back_in_the_service_plane_only) {
     const auto gyro = host.find("gyro");
     host.add({.name = "second", .hid = gyro->children.front()->hid}, gyro);
     const service parent = first_match({{"IONameMatch", "gyro"}});
-    std::string name;
-    EXPECT_EQ(entry_name(first_child(parent, "IOService"), name), platform::success);
-    EXPECT_EQ(name, "gyro-hid");
+    EXPECT_EQ(name_of(first_child(parent, "IOService")), "gyro-hid");
     EXPECT_FALSE(first_child(parent, "IOPower"));
     EXPECT_FALSE(first_child(first_child(parent, "IOService"), "IOService"));
     host.remove("gyro-hid");
-    EXPECT_EQ(entry_name(first_child(parent, "IOService"), name), platform::success);
-    EXPECT_EQ(name, "second");
+    EXPECT_EQ(name_of(first_child(parent, "IOService")), "second");
     host.remove("gyro");
     EXPECT_FALSE(first_child(parent, "IOService"));
     EXPECT_FALSE(first_child(service(), "IOService"));
-}
-
-TEST_F(registry, an_entry_name_has_at_most_127_characters) {
-    host.add({.name = std::string(127, 'x') + "yz", .classes = {"long"}});
-    EXPECT_EQ(matched(matching_class("long")), std::string(127, 'x'));
 }
 
 TEST_F(registry, a_property_comes_back_as_a_copy) {
@@ -134,10 +132,8 @@ TEST_F(registry, a_property_comes_back_as_a_copy) {
     EXPECT_EQ(read_property(gyro, "rate")->number(), 50);
     EXPECT_EQ(*read_property(gyro, "new")->text(), "text");
     EXPECT_EQ(read_property(gyro, "absent"), std::nullopt);
-    EXPECT_EQ(matched({{"IOPropertyMatch", dictionary{{"rate", 50}}}}), "gyro");
-}
-
-TEST_F(registry, an_entry_without_a_driver_takes_no_properties) {
+    EXPECT_EQ(matched(with(dictionary{{"rate", 50}})), "gyro");
+    // An entry without a driver takes none.
     host.add({.name = "bare", .properties = {{"rate", 1}}});
     const service bare = first_match({{"IONameMatch", "bare"}});
     EXPECT_EQ(set_property(bare, "rate", 2), platform::unsupported);
@@ -145,16 +141,19 @@ TEST_F(registry, an_entry_without_a_driver_takes_no_properties) {
 }
 
 TEST_F(registry, an_entry_that_is_gone_has_no_name_and_no_properties) {
+    std::string empty = "untouched";
+    host.fail_call(2, failure::nothing);
+    EXPECT_EQ(entry_name(first_match({}), empty), platform::success);
+    EXPECT_EQ(empty, "");
     const service gyro = first_match({{"IONameMatch", "gyro"}});
+    const service none;
     host.remove("gyro");
-    for (const service* gone : {&gyro, static_cast<const service*>(nullptr)}) {
-        const service none;
-        const service& entry = gone != nullptr ? *gone : none;
+    for (const service* entry : {&gyro, &none}) {
         std::string name = "untouched";
-        EXPECT_EQ(entry_name(entry, name), platform::not_found);
+        EXPECT_EQ(entry_name(*entry, name), platform::not_found);
         EXPECT_EQ(name, "untouched");
-        EXPECT_EQ(read_property(entry, "rate"), std::nullopt);
-        EXPECT_EQ(set_property(entry, "rate", 1), platform::not_found);
+        EXPECT_EQ(read_property(*entry, "rate"), std::nullopt);
+        EXPECT_EQ(set_property(*entry, "rate", 1), platform::not_found);
     }
 }
 

@@ -1,4 +1,6 @@
 // Error statistics, transfer errors and sample ranges.
+#include <algorithm>
+
 #include <gtest/gtest.h>
 
 #include "nrxctl/printers/input_error_stats.h"
@@ -8,27 +10,17 @@
 
 namespace {
 
-using tests::printed;
-using tests::report_with;
+using namespace tests;
+using bytes = std::vector<std::uint8_t>;
+
+std::string printed(nrx::report_printer print, std::string_view service, const bytes& report) {
+    return tests::printed(print, service, 0, report).out;
+}
 
 TEST(input_error_stats, prints_every_counter_under_the_name_of_the_service) {
-    const auto report = report_with(64, {{0, 4, 1},
-                                         {4, 4, 2},
-                                         {8, 4, 3},
-                                         {12, 4, 4},
-                                         {16, 4, 5},
-                                         {20, 4, 6},
-                                         {24, 4, 7},
-                                         {28, 4, 8},
-                                         {32, 4, 9},
-                                         {36, 4, 10},
-                                         {40, 4, 0xffffffff},
-                                         {44, 4, 12},
-                                         {48, 4, 0xffffffff},
-                                         {52, 4, 14},
-                                         {56, 4, 15},
-                                         {60, 4, 16}});
-    EXPECT_EQ(printed(nrx::print_input_error_stats, "accel", 0xe3, report).out,
+    const bytes report = report_with(
+        64, {{0, 4, {1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 0xffffffff, 12, 0xffffffff, 14, 15, 16}}});
+    EXPECT_EQ(printed(nrx::print_input_error_stats, "accel", report),
               "=========== (input report) error stats for <service_id>: accel===========\n"
               "_total_packets_nrx_received         # 4294967295\n"
               "_total_packets_sent_to_ap           # 12\n"
@@ -48,21 +40,14 @@ TEST(input_error_stats, prints_every_counter_under_the_name_of_the_service) {
               "  _status_IOReturnIOError           # 8\n"
               "  _status_IOReturnInternalError     # 9\n"
               "\n");
-    tests::print_every_prefix(nrx::print_input_error_stats, "accel", 0xe3, report, 64,
-                              "nrxctl/printers/input_error_stats.cpp");
-    EXPECT_EQ(printed(nrx::print_input_error_stats, "accel", 0xe3, {}).out, "");
+    print_every_prefix(nrx::print_input_error_stats, "accel", 0xe3, report, 64,
+                       "nrxctl/printers/input_error_stats.cpp");
+    EXPECT_EQ(printed(nrx::print_input_error_stats, "accel", {}), "");
 }
 
-std::vector<std::uint8_t> bus_record(std::string_view name) {
-    auto record = report_with(32, {{0, 4, 100},
-                                   {4, 4, 1},
-                                   {8, 4, 200},
-                                   {12, 4, 0xffffffff},
-                                   {16, 4, 0x80000000},
-                                   {20, 4, 3}});
-    for (std::size_t i = 0; i < 8; ++i) {
-        record[24 + i] = i < name.size() ? static_cast<std::uint8_t>(name[i]) : std::uint8_t{0};
-    }
+bytes bus_record(std::string_view name) {
+    bytes record = report_with(32, {{0, 4, {100, 1, 200, 0xffffffff, 0x80000000, 3}}, {24, 8, 0}});
+    std::copy(name.begin(), name.end(), record.begin() + 24);
     return record;
 }
 
@@ -72,41 +57,35 @@ TEST(transfer_errors, prints_a_line_for_each_whole_record) {
     report.insert(report.end(), second.begin(), second.end());
     const std::string counters =
         " read_errors: 1/100 write_errors: -1/200 other_errors: 3/-2147483648\n";
-    EXPECT_EQ(printed(nrx::print_transfer_errors, "x", 0x45, report).out,
+    EXPECT_EQ(printed(nrx::print_transfer_errors, "x", report),
               "spi0           " + counters + "i2cm0xy        " + counters);
     report.resize(63);
-    EXPECT_EQ(printed(nrx::print_transfer_errors, "x", 0x45, report).out,
-              "spi0           " + counters);
+    EXPECT_EQ(printed(nrx::print_transfer_errors, "x", report), "spi0           " + counters);
     report.resize(31);
-    EXPECT_EQ(printed(nrx::print_transfer_errors, "x", 0x45, report).out, "");
-    EXPECT_EQ(printed(nrx::print_transfer_errors, "x", 0x45, {}).out, "");
+    EXPECT_EQ(printed(nrx::print_transfer_errors, "x", report), "");
+    EXPECT_EQ(printed(nrx::print_transfer_errors, "x", {}), "");
 }
 
 TEST(sample_ranges, prints_the_range_of_each_axis_of_a_motion_sensor) {
-    const auto report = report_with(28, {{0, 4, 0xffffffff},
-                                         {4, 4, 0xffff8000},
-                                         {8, 4, 65536},
-                                         {12, 4, 0},
-                                         {16, 4, 1},
-                                         {20, 4, 0x80000000},
-                                         {24, 4, 0x7fffffff}});
+    const bytes report =
+        report_with(28, {{0, 4, {0xffffffff, 0xffff8000, 65536, 0, 1, 0x80000000, 0x7fffffff}}});
     const std::string text =
         "num_samples: -1\n"
         "x: -0.500000 - +1.000000\n"
         "y: +0.000000 - +0.000015\n"
         "z: -32768.000000 - +32767.999985\n";
     for (const char* service : {"accel", "gyro", "compass"}) {
-        EXPECT_EQ(printed(nrx::print_sample_ranges, service, 0x53, report).out, text);
+        EXPECT_EQ(printed(nrx::print_sample_ranges, service, report), text);
     }
-    tests::print_every_prefix(nrx::print_sample_ranges, "accel", 0x53, report, 28,
-                              "nrxctl/printers/sample_ranges.cpp");
-    EXPECT_EQ(printed(nrx::print_sample_ranges, "gyro", 0x53, {9, 0, 0, 0, 1}).out,
+    print_every_prefix(nrx::print_sample_ranges, "accel", 0x53, report, 28,
+                       "nrxctl/printers/sample_ranges.cpp");
+    EXPECT_EQ(printed(nrx::print_sample_ranges, "gyro", {9, 0, 0, 0, 1}),
               "num_samples: 9\n"
               "x: +0.000000 - +0.000000\n"
               "y: +0.000000 - +0.000000\n"
               "z: +0.000000 - +0.000000\n");
-    EXPECT_EQ(printed(nrx::print_sample_ranges, "als", 0x53, {}).out, "");
-    EXPECT_EQ(printed(nrx::print_sample_ranges, "Accel", 0x53, {'A'}).out,
+    EXPECT_EQ(printed(nrx::print_sample_ranges, "als", {}), "");
+    EXPECT_EQ(printed(nrx::print_sample_ranges, "Accel", {'A'}),
               "00000000: 41                                                | A\n");
 }
 

@@ -6,7 +6,7 @@
 
 namespace {
 
-using tests::printed;
+using namespace tests;
 
 std::string text_or_dump(const std::vector<std::uint8_t>& report) {
     return printed(nrx::print_text_or_dump, "x", 1, report).out;

@@ -1,7 +1,10 @@
 #include "nrxctl/profiler/config_grammar.h"
 
+#include <sstream>
+
 #include "nrxctl/profiler/split.h"
 #include "tests/profiler/profiler_host.h"
+#include "tests/support/word_vector.h"
 
 namespace tests {
 
@@ -37,17 +40,10 @@ parsed parse(const std::string& word) {
     return one;
 }
 
-struct grammar_row {
-    std::string word;
-    std::string configs;
-};
-
-constexpr const char* grammar = "profiler/config_grammar.cpp";
-
 }  // namespace
 
 TEST(config_grammar, words_become_one_record_per_component) {
-    const std::vector<grammar_row> rows{
+    const std::vector<std::pair<std::string, std::string>> rows{
         {"sensor:accel,gyro:data,lat", "2.0 0 5; 2.1 0 5"},
         {"exec:command:command:all", "0.3 0 1f 006c6c61"},
         {"sensor:accel:stop", "2.0 1 0"},
@@ -79,17 +75,8 @@ TEST(config_grammar, words_become_one_record_per_component) {
         {"sensor:accel:stop,lat", "2.0 1 1"},
         {"sensor:accel:0xffffffff", "2.0 0 ffffffff"},
         {"sensor::data", ""},
-    };
-    for (const grammar_row& row : rows) {
-        const parsed one = parse(row.word);
-        EXPECT_TRUE(one.result) << row.word;
-        EXPECT_EQ(described(one.configs), row.configs) << row.word;
-        EXPECT_EQ(one.written.out + one.written.err, "") << row.word;
-    }
-}
-
-TEST(config_grammar, every_component_word_has_its_number) {
-    const std::vector<grammar_row> rows{
+        {"trace:endpoint:all:\xff", "1.1 0 ffffffff 000000ff"},
+        // every component
         {"exec:function", "0.1 0 ffffffff"},
         {"exec:workloop", "0.2 0 ffffffff"},
         {"exec:timing", "0.5 0 ffffffff"},
@@ -105,81 +92,45 @@ TEST(config_grammar, every_component_word_has_its_number) {
          "9.0 0 0; 9.1 0 0; 9.2 0 0; 9.3 0 0; 9.4 0 0; 9.5 0 0"},
         {"wake:wake", "10.0 0 ffff"},
     };
-    for (const grammar_row& row : rows)
-        EXPECT_EQ(described(parse(row.word).configs), row.configs) << row.word;
+    for (const auto& [word, configs] : rows) {
+        const parsed one = parse(word);
+        EXPECT_TRUE(one.result) << word;
+        EXPECT_EQ(described(one.configs), configs) << word;
+        EXPECT_EQ(one.written.out + one.written.err, "") << word;
+    }
 }
 
 TEST(config_grammar, every_report_word_has_its_bits) {
-    struct report_row {
-        std::string component;
-        std::vector<std::pair<std::string, std::uint32_t>> words;
-    };
-    const std::vector<report_row> rows{
-        {"exec:command", {{"all", 0xffffffff}, {"command", 0x1f}, {"report", 0xe0}}},
-        {"exec:extfunction", {{"all", 0xffffffff}}},
-        {"trace:mbi", {{"all", 0xffffffff}}},
+    // A component; words and their masks.
+    const std::vector<std::pair<std::string, std::string>> rows{
+        {"exec:command", "all ffffffff command 1f report e0"},
+        {"exec:extfunction", "all ffffffff"},
+        {"trace:mbi", "all ffffffff"},
         {"sensor:als",
-         {{"all", 0xffff},
-          {"lat", 0x1},
-          {"raw", 0x2},
-          {"data", 0x4},
-          {"rdata", 0x6},
-          {"filtered", 0x8},
-          {"apdata", 0x10},
-          {"writereg", 0x20},
-          {"readreg", 0x40},
-          {"update", 0x80},
-          {"filterstate", 0x100},
-          {"sensorinfo", 0x200},
-          {"annotation", 0x400},
-          {"decimationinfo", 0x800},
-          {"t-magnitude", 0x10000},
-          {"t-latency", 0x20000},
-          {"error", 0x40000},
-          {"t-bad", 0x80000}}},
-        {"orrin:orrin", {{"latency", 0x1}, {"monitor", 0x2}}},
-        {"talvor:talvor", {{"all", 0xffff}}},
-        {"interrupt:gpio", {{"all", 0xffff}}},
+         "all ffff lat 1 raw 2 data 4 rdata 6 filtered 8 apdata 10 writereg 20 readreg 40 "
+         "update 80 filterstate 100 sensorinfo 200 annotation 400 decimationinfo 800 "
+         "t-magnitude 10000 t-latency 20000 error 40000 t-bad 80000"},
+        {"orrin:orrin", "latency 1 monitor 2"},
+        {"talvor:talvor", "all ffff"},
+        {"interrupt:gpio", "all ffff"},
         {"uart:uart0",
-         {{"all", 0xffff},
-          {"preamble", 0x1},
-          {"swhand", 0x2},
-          {"hwhand", 0x4},
-          {"trace", 0x8},
-          {"packet", 0x10},
-          {"baseband", 0x20},
-          {"transport", 0x40},
-          {"test", 0x80}}},
+         "all ffff preamble 1 swhand 2 hwhand 4 trace 8 packet 10 baseband 20 transport 40 "
+         "test 80"},
         {"scm:spi0",
-         {{"all", 0xffffffff},
-          {"ch0", 0x1},
-          {"ch1", 0x2},
-          {"ch2", 0x4},
-          {"ch3", 0x8},
-          {"ch4", 0x10},
-          {"ch5", 0x20},
-          {"ch6", 0x40},
-          {"ch7", 0x80},
-          {"ch8", 0x100},
-          {"ch9", 0x200},
-          {"ch10", 0x400},
-          {"ch11", 0x800},
-          {"ch12", 0x1000},
-          {"ch13", 0x2000},
-          {"ch14", 0x4000},
-          {"ch15", 0x8000}}},
-        {"wake:wake",
-         {{"all", 0xffff},
-          {"wake-req-stats", 0x1},
-          {"wake-req-info", 0x2},
-          {"wake-event-info", 0x4}}},
+         "all ffffffff ch0 1 ch1 2 ch2 4 ch3 8 ch4 10 ch5 20 ch6 40 ch7 80 ch8 100 ch9 200 "
+         "ch10 400 ch11 800 ch12 1000 ch13 2000 ch14 4000 ch15 8000"},
+        {"wake:wake", "all ffff wake-req-stats 1 wake-req-info 2 wake-event-info 4"},
     };
-    for (const report_row& row : rows) {
-        for (const auto& [word, mask] : row.words) {
-            const parsed one = parse(row.component + ":" + word);
-            ASSERT_EQ(one.configs.size(), 1U) << row.component << " " << word;
-            EXPECT_EQ(one.configs[0].reports, mask) << row.component << " " << word;
+    for (const auto& [component, words_and_masks] : rows) {
+        std::istringstream from(words_and_masks);
+        std::string word;
+        std::uint32_t mask = 0;
+        while (from >> word >> std::hex >> mask) {
+            const parsed one = parse(component + ":" + word);
+            ASSERT_EQ(one.configs.size(), 1U) << component << " " << word;
+            EXPECT_EQ(one.configs[0].reports, mask) << component << " " << word;
         }
+        EXPECT_TRUE(from.eof());
     }
 }
 
@@ -190,19 +141,19 @@ TEST(config_grammar, words_that_fail_are_reported_and_keep_what_came_before) {
         std::string reports;
     };
     const std::string too_many_services =
-        failed(grammar, "service_i < (sizeof(config.services) / sizeof(config.services[0]))");
+        failed(grammar_file, "service_i < (sizeof(config.services) / sizeof(config.services[0]))");
     const std::string unknown_component =
-        failed(grammar, "enable_num_components") + failed(grammar, "result");
+        failed(grammar_file, "enable_num_components") + failed(grammar_file, "result");
     const std::vector<failing_row> rows{
         {"", "", ""},
         {"exec", "", ""},
         {"exec:", "", ""},
         {"exec:thread:all:svc1:x", "", ""},
-        {"exce:thread", "", failed(grammar, "false")},
-        {"Exec:thread", "", failed(grammar, "false")},
-        {"all:all", "", failed(grammar, "false")},
-        {"exec:thread,function", "", failed(grammar, "components.size() == 1")},
-        {"exec::all", "", failed(grammar, "components.size() == 1")},
+        {"exce:thread", "", failed(grammar_file, "false")},
+        {"Exec:thread", "", failed(grammar_file, "false")},
+        {"all:all", "", failed(grammar_file, "false")},
+        {"exec:thread,function", "", failed(grammar_file, "components.size() == 1")},
+        {"exec::all", "", failed(grammar_file, "components.size() == 1")},
         {"exec:3", "", unknown_component},
         {"sensor:7", "", unknown_component},
         {"sensor:gyro,all,accel", "2.1 0 ffff", unknown_component},
@@ -219,11 +170,7 @@ TEST(config_grammar, words_that_fail_are_reported_and_keep_what_came_before) {
 }
 
 TEST(config_grammar, words_that_are_no_numbers_of_32_bits_end_the_process) {
-    struct refused_row {
-        std::string word;
-        std::string message;
-    };
-    const std::vector<refused_row> rows{
+    const std::vector<std::pair<std::string, std::string>> rows{
         {"trace:bogus", "component is invalid (bogus)\n"},
         {"trace:,endpoint:all", "component is invalid ()\n"},
         {"trace:-1", "component is invalid (-1)\n"},
@@ -234,23 +181,19 @@ TEST(config_grammar, words_that_are_no_numbers_of_32_bits_end_the_process) {
         {"wake:wake:4294967296", "report mask is invalid (4294967296)\n"},
         {"orrin:orrin:0x", "report mask is invalid (0x)\n"},
     };
-    for (const refused_row& row : rows) {
-        const parsed one = parse(row.word);
-        EXPECT_EQ(one.written.status, 1) << row.word;
-        EXPECT_EQ(one.written.out, row.message) << row.word;
-        EXPECT_TRUE(one.configs.empty()) << row.word;
+    for (const auto& [word, message] : rows) {
+        const parsed one = parse(word);
+        EXPECT_EQ(one.written.status, 1) << word;
+        EXPECT_EQ(one.written.out, message) << word;
+        EXPECT_TRUE(one.configs.empty()) << word;
     }
 }
 
 TEST(config_grammar, all_words_that_are_left_are_taken_up_to_the_first_that_fails) {
-    std::array<std::string, 5> words{"nrxctl", "wake:all", "scm:stop", "sensor", "wake:all"};
-    std::vector<char*> argv;
-    for (std::string& word : words)
-        argv.push_back(word.data());
+    const word_vector words({"nrxctl", "wake:all", "scm:stop", "sensor", "wake:all"});
     std::vector<nrx::profiler_config> configs;
     int index = 1;
-    const std::span<char* const> all(argv);
-    nrx::argument_words left(all.first(3), index);
+    nrx::argument_words left(words.all().first(3), index);
     EXPECT_TRUE(nrx::parse_profiler_configs(left, configs));
     EXPECT_EQ(described(configs), "10.0 0 ffff; 9.0 2 ffffffff");
     EXPECT_EQ(index, 3);
@@ -259,23 +202,22 @@ TEST(config_grammar, all_words_that_are_left_are_taken_up_to_the_first_that_fail
 
     configs.clear();
     index = 2;
-    nrx::argument_words failing(all, index);
+    nrx::argument_words failing(words.all(), index);
     const outcome written =
         capture([&] { EXPECT_FALSE(nrx::parse_profiler_configs(failing, configs)); });
-    EXPECT_EQ(written.err, failed(grammar, "result"));
+    EXPECT_EQ(written.err, failed(grammar_file, "result"));
     EXPECT_EQ(configs.size(), 1U);
     EXPECT_EQ(index, 4);
 }
 
 TEST(config_grammar, split_keeps_empty_fields_but_for_the_last) {
-    using fields = std::vector<std::string_view>;
-    EXPECT_EQ(nrx::split("", ':'), fields{});
-    EXPECT_EQ(nrx::split(":", ':'), fields{""});
-    EXPECT_EQ(nrx::split("::", ':'), (fields{"", ""}));
-    EXPECT_EQ(nrx::split("a", ':'), fields{"a"});
-    EXPECT_EQ(nrx::split("a:", ':'), fields{"a"});
-    EXPECT_EQ(nrx::split("a::b", ':'), (fields{"a", "", "b"}));
-    EXPECT_EQ(nrx::split(":b", ':'), (fields{"", "b"}));
+    const std::vector<std::pair<std::string_view, std::vector<std::string_view>>> rows{
+        {"", {}},          {":", {""}},   {"::", {"", ""}},
+        {"a", {"a"}},      {"a:", {"a"}}, {"a::b", {"a", "", "b"}},
+        {":b", {"", "b"}},
+    };
+    for (const auto& [text, fields] : rows)
+        EXPECT_EQ(nrx::split(text, ':'), fields) << text;
 }
 
 }  // namespace tests

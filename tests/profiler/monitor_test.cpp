@@ -1,13 +1,12 @@
 #include "nrxctl/profiler/monitor.h"
 
-#include <algorithm>
 #include <csignal>
+#include <tuple>
 
-#include "nrxctl/base/tick_period.h"
 #include "nrxctl/decoders/profile_hexdump.h"
 #include "nrxctl/profiler/interrupt_stop.h"
-#include "platform/clock.h"
 #include "tests/profiler/profiler_host.h"
+#include "tests/support/word_vector.h"
 
 namespace tests {
 
@@ -15,20 +14,14 @@ using namespace std::chrono_literals;
 
 namespace {
 
-constexpr const char* conn = "profiler/profiler_conn.cpp";
-constexpr const char* monitor_file = "profiler/monitor.cpp";
-constexpr const char* command_file = "base/command_channel.cpp";
-constexpr const char* channel_file = "base/channel.cpp";
-constexpr const char* gone_text = "service not found (0xe00002f0)";
-constexpr const char* io_text = "device i/o failure (0xe0000401)";
-constexpr const char* unsupported_text = "unsupported request (0xe00002c7)";
-
 const byte_list marker = record_bytes(0, 0);
-const std::string stop_call = "call KeltoNRXProfileDriver 11 scalars [] in [] results 0 room 0";
 
-// What the coprocessor's log holds, at most once.
-std::string log_line() {
-    return dumped(8, 0x77);
+// Whether the stream came to its end, and what was written.
+using run = std::tuple<bool, std::string, std::string>;
+
+// A run to the end: the records, then the coprocessor's log.
+run ended(const std::string& records, const std::string& reports = "") {
+    return {true, records + dumped(8, 0x77) + "done\n", reports};
 }
 
 }  // namespace
@@ -37,7 +30,6 @@ class monitor : public profiler_test {
 protected:
     void SetUp() override {
         profiler_test::SetUp();
-        nrx::tick_period = platform::tick_period();
         put_both_halves();
         service->set_report_source(0xd1, [this](std::size_t, byte_list& reply) {
             if (!std::exchange(log_read_, true)) reply = record_bytes(8, 0x77);
@@ -52,38 +44,26 @@ protected:
     void interrupt_at(std::chrono::milliseconds at) {
         host.clock().plan(at, [] { std::raise(SIGINT); });
     }
-
-    struct run {
-        bool ended;
-        std::string out;
-        std::string err;
-        bool operator==(const run&) const = default;
-        friend void PrintTo(const run& one, std::ostream* to) {
-            *to << one.ended << "\n" << one.out << one.err;
-        }
-    };
-    run watch(std::uint32_t duration = 0) {
-        log_read_ = false;
-        run one{};
-        const outcome written = capture([&] {
-            const nrx::interrupt_stop stop_while_running;
-            one.ended = nrx::monitor_profiler(duration, nrx::dump_profile_record);
-        });
-        one.out = written.out;
-        one.err = written.err;
-        return one;
-    }
-
     // Lets the driver end the stream when it is asked to.
     void end_on_stop() {
         driver->actions[11] = [this] { driver->queue->add(marker); };
+    }
+
+    run watch(std::uint32_t duration = 0) {
+        log_read_ = false;
+        bool has_ended = false;
+        const outcome written = capture([&] {
+            const nrx::interrupt_stop stop_while_running;
+            has_ended = nrx::monitor_profiler(duration, nrx::dump_profile_record);
+        });
+        return {has_ended, written.out, written.err};
     }
 
 private:
     bool log_read_ = false;
 };
 
-TEST_F(monitor, words_give_duration_and_human_flag_and_are_announced) {
+TEST(monitor_words, give_duration_and_human_flag_and_are_announced) {
     struct argument_row {
         std::vector<std::string> words;
         std::uint32_t duration;
@@ -92,31 +72,21 @@ TEST_F(monitor, words_give_duration_and_human_flag_and_are_announced) {
         std::string line;
     };
     const std::vector<argument_row> rows{
-        {{}, 0, false, 0, "duration=0 us mode=auto (humanReadable=disabled)\n"},
-        {{"human"}, 0, true, 1, "duration=0 us mode=auto (humanReadable=enabled)\n"},
-        {{"human", "250", "x"},
-         250000,
-         true,
-         2,
-         "duration=250000 us mode=enable (humanReadable=enabled)\n"},
-        {{"auto", "human"}, 0, false, 1, "duration=0 us mode=auto (humanReadable=disabled)\n"},
-        {{"0x10"}, 16000, false, 1, "duration=16000 us mode=enable (humanReadable=disabled)\n"},
-        {{"0"}, 0, false, 1, "duration=0 us mode=auto (humanReadable=disabled)\n"},
-        {{"4294967"},
-         4294967000,
-         false,
-         1,
-         "duration=-296 us mode=enable (humanReadable=disabled)\n"},
+        {{}, 0, false, 0, "0 us mode=auto (humanReadable=disabled)\n"},
+        {{"human"}, 0, true, 1, "0 us mode=auto (humanReadable=enabled)\n"},
+        {{"human", "250", "x"}, 250000, true, 2, "250000 us mode=enable (humanReadable=enabled)\n"},
+        {{"auto", "human"}, 0, false, 1, "0 us mode=auto (humanReadable=disabled)\n"},
+        {{"0x10"}, 16000, false, 1, "16000 us mode=enable (humanReadable=disabled)\n"},
+        {{"0"}, 0, false, 1, "0 us mode=auto (humanReadable=disabled)\n"},
+        {{"4294967"}, 4294967000, false, 1, "-296 us mode=enable (humanReadable=disabled)\n"},
     };
     for (const argument_row& row : rows) {
-        std::vector<std::string> words = row.words;
-        std::vector<char*> argv;
-        for (std::string& word : words)
-            argv.push_back(word.data());
+        const word_vector words(row.words);
         int index = 0;
-        nrx::argument_words left(argv, index);
+        nrx::argument_words left(words.all(), index);
         nrx::monitor_args args;
-        EXPECT_EQ(capture([&] { args = nrx::parse_monitor_args(left); }).out, row.line);
+        EXPECT_EQ(capture([&] { args = nrx::parse_monitor_args(left); }).out,
+                  "duration=" + row.line);
         EXPECT_EQ(args.duration, row.duration) << row.line;
         EXPECT_EQ(args.human, row.human) << row.line;
         EXPECT_EQ(index, row.taken) << row.line;
@@ -133,8 +103,7 @@ TEST_F(monitor, stream_is_printed_as_it_comes_until_the_end_marker) {
     arrive(10ms, record_bytes(3, 2));
     arrive(10ms, record_bytes(3, 3));
     arrive(20ms, marker);
-    EXPECT_EQ(watch(),
-              (run{true, dumped(3, 1) + dumped(3, 2) + dumped(3, 3) + log_line() + "done\n", ""}));
+    EXPECT_EQ(watch(), ended(dumped(3, 1) + dumped(3, 2) + dumped(3, 3)));
     EXPECT_EQ(host.clock().now(), 120ms);
     EXPECT_EQ(happened(), (std::vector<std::string>{
                               "open KeltoNRXProfileDriver type 0",
@@ -178,7 +147,7 @@ TEST_F(monitor, end_marker_in_every_position_lets_the_last_drain_pick_up_what_fo
             driver->queue->add(i == position ? marker : record_bytes(3, i));
             if (i != position) printed += dumped(3, i);
         }
-        EXPECT_EQ(watch(), (run{true, printed + log_line() + "done\n", ""})) << position;
+        EXPECT_EQ(watch(), ended(printed)) << position;
     }
 }
 
@@ -187,7 +156,7 @@ TEST_F(monitor, second_end_marker_ends_the_last_drain_and_the_grace_lets_records
     arrive(90ms, record_bytes(3, 1));
     arrive(95ms, marker);
     arrive(95ms, record_bytes(3, 2));
-    EXPECT_EQ(watch(), (run{true, dumped(3, 1) + log_line() + "done\n", ""}));
+    EXPECT_EQ(watch(), ended(dumped(3, 1)));
     EXPECT_EQ(driver->queue->size(), 1U);
 }
 
@@ -195,65 +164,51 @@ TEST_F(monitor, duration_is_told_to_the_coprocessor_and_ends_the_run_when_data_a
     arrive(50ms, record_bytes(3, 1));
     arrive(51ms, record_bytes(3, 2));
     arrive(70ms, record_bytes(3, 3));
-    EXPECT_EQ(watch(50'000),
-              (run{true, dumped(3, 1) + dumped(3, 2) + dumped(3, 3) + log_line() + "done\n", ""}));
+    EXPECT_EQ(watch(50'000), ended(dumped(3, 1) + dumped(3, 2) + dumped(3, 3)));
     EXPECT_EQ(host.clock().now(), 151ms);
     EXPECT_EQ(logged("call")[0], "call profile 1 scalars [0xd2] in [50 c3 00 00] results 0 room 0");
 }
 
-TEST_F(monitor, without_the_coprocessor_sends_no_duration_and_reports_its_missing_log) {
+TEST_F(monitor, starts_only_if_it_can_tell_the_duration_or_there_is_no_coprocessor) {
+    service->drop_report(0xd2);
+    EXPECT_EQ(watch(), run(false, "",
+                           failed(command_file, "kr == 0 ", unsupported_text) +
+                               failed(monitor_file, "kr == 0 ", unsupported_text)));
     host.remove("profile");
     driver->queue->add(marker);
     EXPECT_EQ(watch(1000),
-              (run{true, "done\n",
-                   failed(channel_file, "service") +
-                       failed("base/profile_records.cpp", "result == 0 ", gone_text)}));
+              run(true, "done\n",
+                  failed(channel_file, "service") +
+                      failed("base/profile_records.cpp", "result == 0 ", not_found_text)));
 }
 
-TEST_F(monitor, fails_before_anything_is_printed_if_it_cannot_start) {
-    service->drop_report(0xd2);
-    EXPECT_EQ(watch(), (run{false, "",
-                            failed(command_file, "kr == 0 ", unsupported_text) +
-                                failed(monitor_file, "kr == 0 ", unsupported_text)}));
-    driver->queue = nullptr;
-    EXPECT_EQ(watch(),
-              (run{false, "",
-                   failed(conn, "kr == 0 ", unsupported_text) + failed(monitor_file, "success")}));
-    host.remove(driver_name);
-    EXPECT_EQ(watch(), (run{false, "",
-                            failed(conn, "service") + failed(conn, "success") +
-                                failed(monitor_file, "success")}));
-}
-
-TEST_F(monitor, failed_dequeue_ends_it_and_keeps_what_is_printed) {
+TEST_F(monitor, queue_that_fails_ends_it_and_keeps_what_is_printed) {
     driver->queue->add(record_bytes(3, 1));
     driver->queue->add(byte_list(49, 1));
-    const std::string code = "reply larger than the room for it (0xe0000402)";
-    EXPECT_EQ(watch(), (run{false, dumped(3, 1),
-                            failed(monitor_file, "kr == 0 ", code) +
-                                failed(monitor_file, "kr == 0 ", code)}));
+    const std::string no_room =
+        failed(monitor_file, "kr == 0 ", "reply larger than the room for it (0xe0000402)");
+    EXPECT_EQ(watch(), run(false, dumped(3, 1), no_room + no_room));
+    driver->queue->clear();
+    host.clock().plan(30ms, [this] { host.remove(driver_name); });
+    EXPECT_EQ(watch(), run(false, "", failed(monitor_file, "kr == 0 ", not_found_text)));
 }
 
 TEST_F(monitor, short_entries_are_reported_and_read_as_0_beyond_their_end) {
     driver->queue->add({3, 0xff});
     driver->queue->add({});
-    std::string line = dumped(0, 0);
-    line.replace(std::string("prof-event ").size(), 4, "03ff");
     const std::string too_short = failed(monitor_file, "length >= 48");
-    EXPECT_EQ(watch(), (run{true, line + log_line() + "done\n", too_short + too_short}));
+    EXPECT_EQ(watch(),
+              ended("prof-event 03ff" + std::string(92, '0') + "\n", too_short + too_short));
 }
 
-TEST_F(monitor, driver_that_vanishes_ends_the_wait) {
-    host.clock().plan(30ms, [this] { host.remove(driver_name); });
-    EXPECT_EQ(watch(), (run{false, "", failed(monitor_file, "kr == 0 ", gone_text)}));
-}
-
-TEST_F(monitor, interrupt_asks_for_the_end_of_the_stream) {
+TEST_F(monitor, interrupt_asks_for_the_end_of_the_stream_however_often_it_comes) {
     end_on_stop();
-    arrive(10ms, record_bytes(3, 1));
-    interrupt_at(15ms);
-    EXPECT_EQ(watch(), (run{true, dumped(3, 1) + log_line() + "done\n", ""}));
-    EXPECT_EQ(host.clock().now(), 115ms);
+    arrive(5ms, record_bytes(3, 1));
+    interrupt_at(10ms);
+    interrupt_at(10ms);
+    interrupt_at(60ms);
+    EXPECT_EQ(watch(), ended(dumped(3, 1)));
+    EXPECT_EQ(host.clock().now(), 110ms);
 }
 
 TEST_F(monitor, interrupt_at_any_platform_call_ends_it_in_good_order) {
@@ -261,7 +216,8 @@ TEST_F(monitor, interrupt_at_any_platform_call_ends_it_in_good_order) {
     const auto stream_a_record = [&] {
         driver->queue->clear();
         driver->queue->add(record_bytes(3, 1));
-        host.clock().plan(host.clock().now() + 10ms, [this] { driver->queue->add(marker); });
+        arrive(std::chrono::duration_cast<std::chrono::milliseconds>(host.clock().now()) + 10ms,
+               marker);
     };
     stream_a_record();
     const std::size_t calls_before = host.calls_made();
@@ -269,31 +225,18 @@ TEST_F(monitor, interrupt_at_any_platform_call_ends_it_in_good_order) {
     const std::size_t calls = host.calls_made() - calls_before;
     for (std::size_t call = 1; call <= calls; ++call) {
         stream_a_record();
-        const auto stops = [&] {
-            return std::count(host.log().begin(), host.log().end(), stop_call);
-        };
-        const auto stops_before = stops();
+        const auto before = times(end_stream_call);
         host.before_call(call, [] { std::raise(SIGINT); });
-        EXPECT_EQ(watch(), (run{true, dumped(3, 1) + log_line() + "done\n", ""})) << call;
-        EXPECT_EQ(stops(), stops_before + 1) << call;
+        EXPECT_EQ(watch(), ended(dumped(3, 1))) << call;
+        EXPECT_EQ(times(end_stream_call), before + 1) << call;
     }
-}
-
-TEST_F(monitor, interrupts_twice_in_a_row_and_in_the_grace_end_it_once) {
-    end_on_stop();
-    interrupt_at(10ms);
-    interrupt_at(10ms);
-    interrupt_at(60ms);
-    EXPECT_EQ(watch(), (run{true, log_line() + "done\n", ""}));
-    EXPECT_EQ(host.clock().now(), 110ms);
 }
 
 TEST_F(monitor, interrupt_that_the_driver_refuses_is_reported_and_the_monitor_goes_on) {
     driver->answers[11] = {{.code = platform::simulated::io_failure}};
     interrupt_at(10ms);
     arrive(20ms, marker);
-    EXPECT_EQ(watch(), (run{true, log_line() + "done\n",
-                            failed("profiler/kernel_profiler.cpp", "kr == 0 ", io_text)}));
+    EXPECT_EQ(watch(), ended("", failed(kernel_file, "kr == 0 ", io_text)));
 }
 
 }  // namespace tests

@@ -3,7 +3,11 @@
 #include <algorithm>
 #include <csignal>
 
+#include "nrxctl/base/tick_period.h"
 #include "nrxctl/profiler/profile_command.h"
+#include "platform/clock.h"
+#include "tests/support/report_bytes.h"
+#include "tests/support/word_vector.h"
 
 namespace tests {
 
@@ -42,13 +46,18 @@ byte_list joined(const std::vector<byte_list>& lists) {
     return all;
 }
 
-byte_list words_of(const std::vector<std::uint32_t>& words) {
-    byte_list bytes;
-    for (const std::uint32_t word : words) {
-        for (unsigned shift = 0; shift < 32; shift += 8)
-            bytes.push_back(static_cast<std::uint8_t>(word >> shift));
-    }
-    return bytes;
+byte_list words_of(std::initializer_list<std::uint64_t> words) {
+    return report_with(4 * words.size(), {{0, 4, words}});
+}
+
+void profiler_test::SetUp() {
+    device_test::SetUp();
+    nrx::tick_period = platform::tick_period();
+}
+
+void profiler_test::TearDown() {
+    EXPECT_TRUE(has_default_action());
+    device_test::TearDown();
 }
 
 void profiler_test::put_both_halves() {
@@ -67,11 +76,21 @@ interface_driver& profiler_test::put_profile_service() {
     service = &put_service(host, "profile", 0x50);
     for (const std::uint32_t report : {0xd0U, 0xd1U, 0xd2U, 0xd5U})
         service->set_report(report, {});
-    for (const std::uint32_t code : {0x20U, 0x21U, 0x23U, 0x24U}) {
-        service->set_command(code,
-                             [](platform::byte_view, byte_list&) { return platform::success; });
-    }
+    for (const std::uint32_t command : {0x20U, 0x21U, 0x23U, 0x24U})
+        answer(command, platform::success);
     return *service;
+}
+
+void profiler_test::answer(std::uint32_t command, platform::return_code code,
+                           const byte_list& reply) {
+    service->set_command(command, [=](platform::byte_view, byte_list& answered) {
+        answered = reply;
+        return code;
+    });
+}
+
+std::ptrdiff_t profiler_test::times(std::string_view call) const {
+    return std::count(host.log().begin(), host.log().end(), call);
 }
 
 bool has_default_action() {
@@ -91,12 +110,9 @@ std::vector<std::string> profiler_test::happened() {
 }
 
 outcome profiler_test::profile(std::vector<std::string> words) {
-    std::vector<char*> argv;
-    argv.reserve(words.size());
-    for (std::string& word : words)
-        argv.push_back(word.data());
+    const word_vector all(std::move(words));
     int index = 1;
-    outcome written = capture([&] { nrx::profile_command(words[0], argv, index); });
+    outcome written = capture([&] { nrx::profile_command(all.all()[0], all.all(), index); });
     taken = index - 1;
     return written;
 }

@@ -49,18 +49,39 @@ std::string dumped(std::uint8_t type, std::uint8_t mark);
 byte_list joined(const std::vector<byte_list>& lists);
 
 // Little-endian 32-bit words.
-byte_list words_of(const std::vector<std::uint32_t>& words);
+byte_list words_of(std::initializer_list<std::uint64_t> words);
 
 // Whether an interrupt would end the process.
 bool has_default_action();
 
+// Calls on the driver, in the words of the log.
+inline constexpr const char* enable_call =
+    "call KeltoNRXProfileDriver 0 scalars [0x1] in [] results 0 room 0";
+inline constexpr const char* disable_call =
+    "call KeltoNRXProfileDriver 0 scalars [0x0] in [] results 0 room 0";
+inline constexpr const char* status_call =
+    "call KeltoNRXProfileDriver 1 scalars [] in [] results 1 room 0";
+inline constexpr const char* end_stream_call =
+    "call KeltoNRXProfileDriver 11 scalars [] in [] results 0 room 0";
+
 class profiler_test : public device_test {
 protected:
+    // The tool's clock is the host's.
+    void SetUp() override;
+    // Whatever was done, an interrupt ends the process again.
+    void TearDown() override;
+
     // Registers the kernel's driver and the service "profile", which takes every request of the
     // profiler and answers with nothing.
     void put_both_halves();
     scripted_driver& put_driver();
     interface_driver& put_profile_service();
+
+    // Lets the service answer a command.
+    void answer(std::uint32_t command, platform::return_code code, const byte_list& reply = {});
+
+    // How often a call was made.
+    [[nodiscard]] std::ptrdiff_t times(std::string_view call) const;
 
     // The calls and what else happened on the host since the last time, but for services looked up
     // and released.
@@ -77,7 +98,14 @@ private:
     std::size_t seen_ = 0;
 };
 
-// Failure reports of the library.
+// Source files of the library, and failure reports of checks in them.
+inline constexpr const char* apply_file = "profiler/apply_configs.cpp";
+inline constexpr const char* channel_file = "base/channel.cpp";
+inline constexpr const char* command_file = "base/command_channel.cpp";
+inline constexpr const char* conn_file = "profiler/profiler_conn.cpp";
+inline constexpr const char* grammar_file = "profiler/config_grammar.cpp";
+inline constexpr const char* kernel_file = "profiler/kernel_profiler.cpp";
+inline constexpr const char* monitor_file = "profiler/monitor.cpp";
 std::string failed(std::string_view file, std::string_view condition, std::string_view code = "");
 
 }  // namespace tests

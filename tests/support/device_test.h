@@ -25,6 +25,12 @@ using platform::simulated::machine;
 // Registers an interface service with a name and an id; the driver that answers for it.
 interface_driver& put_service(machine& host, std::string_view name, std::int32_t id);
 
+// What a failure report says of a code.
+inline constexpr const char* no_memory_text = "out of memory (0xe00002bd)";
+inline constexpr const char* unsupported_text = "unsupported request (0xe00002c7)";
+inline constexpr const char* not_found_text = "service not found (0xe00002f0)";
+inline constexpr const char* io_text = "device i/o failure (0xe0000401)";
+
 // The line that a failed check of a subsystem writes, without the line number of the file.
 std::string failure_line(std::string_view label, std::string_view condition, std::string_view file,
                          std::string_view code = "");

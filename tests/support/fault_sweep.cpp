@@ -8,26 +8,6 @@ using platform::simulated::failure;
 using platform::simulated::installed_machine;
 using platform::simulated::machine;
 
-namespace {
-
-const char* name_of(failure how) {
-    switch (how) {
-        case failure::io:
-            return "io";
-        case failure::unsupported:
-            return "unsupported";
-        case failure::not_found:
-            return "not_found";
-        case failure::no_memory:
-            return "no_memory";
-        case failure::nothing:
-            return "nothing";
-    }
-    return "?";
-}
-
-}  // namespace
-
 void sweep_faults(const std::function<std::unique_ptr<machine>()>& make_host,
                   const std::function<void()>& operation,
                   const std::function<bool(const fault&)>& acceptable) {
@@ -49,8 +29,9 @@ void sweep_faults(const std::function<std::unique_ptr<machine>()>& make_host,
             host->before_call(call, [&] { name = host->log().back(); });
             const outcome result = capture(operation);
             const fault one{call, name, how, result};
-            const std::string where =
-                "call " + std::to_string(call) + " (" + name + "), failure " + name_of(how);
+            const std::string where = "call " + std::to_string(call) + " (" + name +
+                                      "), which fails with " +
+                                      std::string(platform::return_code_text(code_of(how)));
             EXPECT_FALSE(name.empty()) << "call " << call << " was not made a second time";
             EXPECT_TRUE(acceptable(one)) << where << "\n" << one.result.out << one.result.err;
             EXPECT_EQ(host->open_handles(), 0U) << where;

@@ -6,6 +6,8 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include "tests/support/word_vector.h"
+
 namespace tests {
 
 namespace {
@@ -39,23 +41,6 @@ std::string joined(const std::vector<std::string>& pieces) {
     return all;
 }
 
-pid_t start(const std::string& path, const std::vector<std::string>& arguments, int out, int err) {
-    std::vector<char*> words{const_cast<char*>(path.c_str())};
-    for (const std::string& word : arguments)
-        words.push_back(const_cast<char*>(word.c_str()));
-    words.push_back(nullptr);
-    const pid_t child = ::fork();
-    if (child != 0) return child;
-    if (out >= 0) {
-        ::dup2(out, STDOUT_FILENO);
-    } else {
-        ::close(STDOUT_FILENO);
-    }
-    ::dup2(err, STDERR_FILENO);
-    ::execv(path.c_str(), words.data());
-    ::_exit(127);
-}
-
 int wait_for(pid_t child) {
     int status = 0;
     ::waitpid(child, &status, 0);
@@ -82,11 +67,28 @@ pipe_ends open_target(output_to target) {
 
 }  // namespace
 
+pid_t start_program(const std::string& path, const std::vector<std::string>& arguments, int out,
+                    int err) {
+    std::vector<std::string> words{path};
+    words.insert(words.end(), arguments.begin(), arguments.end());
+    word_vector all(std::move(words));
+    const pid_t child = ::fork();
+    if (child != 0) return child;
+    if (out >= 0) {
+        ::dup2(out, STDOUT_FILENO);
+    } else {
+        ::close(STDOUT_FILENO);
+    }
+    ::dup2(err, STDERR_FILENO);
+    ::execv(path.c_str(), all.argv());
+    ::_exit(127);
+}
+
 program_result run_program(const std::string& path, const std::vector<std::string>& arguments,
                            output_to target) {
     const pipe_ends out = open_target(target);
     const pipe_ends err = make_pipe();
-    const pid_t child = start(path, arguments, out.write_end, err.write_end);
+    const pid_t child = start_program(path, arguments, out.write_end, err.write_end);
     if (out.write_end >= 0) ::close(out.write_end);
     ::close(err.write_end);
     auto errors = std::async(std::launch::async, [&] { return joined(read_pieces(err.read_end)); });
@@ -100,7 +102,7 @@ std::vector<std::string> writes_of(const std::string& path,
                                    const std::vector<std::string>& arguments) {
     const pipe_ends out = make_pipe(O_DIRECT);
     const int err = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
-    const pid_t child = start(path, arguments, out.write_end, err);
+    const pid_t child = start_program(path, arguments, out.write_end, err);
     ::close(out.write_end);
     ::close(err);
     auto pieces = read_pieces(out.read_end);

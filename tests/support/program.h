@@ -2,6 +2,7 @@
 #pragma once
 
 #include <string>
+#include <sys/types.h>
 #include <vector>
 
 namespace tests {
@@ -14,6 +15,10 @@ struct program_result {
 
 // Where a program's standard output goes.
 enum class output_to { pipe, closed_pipe, full_device, nowhere };
+
+// Starts the program with descriptors for its output; a negative one stands for none. Its process.
+pid_t start_program(const std::string& path, const std::vector<std::string>& arguments, int out,
+                    int err);
 
 // Runs the program to its end with its standard output and standard error kept apart.
 program_result run_program(const std::string& path, const std::vector<std::string>& arguments,

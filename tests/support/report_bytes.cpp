@@ -11,9 +11,10 @@ namespace tests {
 std::vector<std::uint8_t> report_with(std::size_t size, std::initializer_list<number_at> numbers,
                                       std::uint8_t filler) {
     std::vector<std::uint8_t> report(size, filler);
-    for (const number_at& number : numbers) {
-        for (std::size_t i = 0; i < number.width; ++i) {
-            report.at(number.offset + i) = static_cast<std::uint8_t>(number.value >> (8 * i));
+    for (const number_at& one : numbers) {
+        for (std::size_t i = 0; i < one.width * one.values.size(); ++i) {
+            const std::uint64_t value = one.values[i / one.width];
+            report.at(one.offset + i) = static_cast<std::uint8_t>(value >> (8 * (i % one.width)));
         }
     }
     return report;

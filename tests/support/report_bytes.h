@@ -12,11 +12,18 @@
 
 namespace tests {
 
-// One little-endian number of a report.
+// One number, or several.
+class number_list : public std::vector<std::uint64_t> {
+public:
+    number_list(std::uint64_t one) : vector(1, one) {}
+    number_list(std::initializer_list<std::uint64_t> all) : vector(all) {}
+};
+
+// Little-endian numbers of a report that follow each other.
 struct number_at {
     std::size_t offset;
     std::size_t width;
-    std::uint64_t value;
+    number_list values;
 };
 
 // A report of a size with numbers in it, and filler everywhere else: what is not listed must not

@@ -9,21 +9,11 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include "tests/support/program.h"
+
 namespace tests {
 
 namespace {
-
-[[noreturn]] void become(const std::string& path, const std::vector<std::string>& arguments,
-                         int output) {
-    std::vector<char*> words{const_cast<char*>(path.c_str())};
-    for (const std::string& word : arguments)
-        words.push_back(const_cast<char*>(word.c_str()));
-    words.push_back(nullptr);
-    ::dup2(output, STDOUT_FILENO);
-    ::dup2(::open("/dev/null", O_WRONLY | O_CLOEXEC), STDERR_FILENO);
-    ::execv(path.c_str(), words.data());
-    ::_exit(127);
-}
 
 double seconds(const timeval& time) {
     return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
@@ -35,9 +25,10 @@ running_program::running_program(const std::string& path,
                                  const std::vector<std::string>& arguments) {
     std::array<int, 2> ends{};
     if (::pipe2(ends.data(), O_CLOEXEC) != 0) return;
-    child_ = ::fork();
-    if (child_ == 0) become(path, arguments, ends[1]);
+    const int err = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
+    child_ = start_program(path, arguments, ends[1], err);
     ::close(ends[1]);
+    ::close(err);
     output_ = ends[0];
 }
 
