@@ -8,7 +8,8 @@
 namespace nrx {
 
 // Asks a sensor service for its clients (command 0x39) and prints them as a table, label before
-// each line. Nothing is printed if the service does not answer.
+// each line. Nothing is printed if the service does not answer; that it is missing or cannot be
+// opened is reported.
 void print_client_table(std::string_view label, std::string_view service_name);
 
 // Prints the table's heading, and a line for each entry in use. Entries are 31 bytes, packed:

@@ -61,8 +61,8 @@ private:
     std::int32_t failure_value_ = 0;
 };
 
-// Reads a report. That the service is missing or does not answer is not reported; a reply too short
-// for a report of a fixed size is.
+// Reads a report. That the service is missing or does not answer is not reported; that it cannot be
+// opened is, and a reply too short for a report of a fixed size.
 sensor_reply read_sensor_report(std::string_view service_name, const sensor_report& report);
 
 // What every sensor may tell about itself, in the order in which it is asked.
