@@ -47,9 +47,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const platform::simulated::installed_machine installed(host);
     const auto sensor = std::make_shared<interface_driver>();
     host.add({.name = name, .classes = {"KeltoNRXInterface"}, .unit = sensor});
-    // Without an interval there would be nothing to see.
-    append_reply(*sensor, 0, byte_list{0x10, 0x27, 0, 0});
     put_replies(*sensor, {data + 1, size - 1});
+    // Without an interval there would be nothing to see.
+    if (sensor->report(0) == nullptr) sensor->set_report(0, {0x10, 0x27, 0, 0});
     if (const byte_list* clients = sensor->report(clients_id)) {
         sensor->set_command(0x39, [clients](platform::byte_view, byte_list& reply) {
             reply = *clients;

@@ -1,6 +1,7 @@
 #include "nrxctl/inspection/hid_service_list.h"
 
 #include <regex>
+#include <tuple>
 
 #include "tests/inspection/sensor_host.h"
 
@@ -8,8 +9,9 @@ namespace tests {
 
 class hid_service_list : public device_test {
 protected:
-    void put_hid_interface(const std::string& name) {
-        host.add({.name = name, .classes = {"KeltoNRXHIDInterface"}});
+    void put_hid_interfaces(std::initializer_list<const char*> names) {
+        for (const char* name : names)
+            host.add({.name = name, .classes = {"KeltoNRXHIDInterface"}});
     }
 };
 
@@ -24,57 +26,55 @@ outcome list_for(std::string_view name) {
     return result;
 }
 
-const std::string nothing_matches =
-    "Matching WQR_nobody [0x*, 0]\n"
-    "Matching nobody [0x*, 0]\n"
-    "\n\n\n";
-const std::string reported =
-    failure_line("nrxtoollib", "kr == 0", "nrxctl/inspection/hid_service_list.cpp");
-
-TEST_F(hid_service_list, follows_the_reason_if_there_is_no_such_service) {
-    put_hid_interface("accel");
-    put_service(host, "stranger", 3);
-    put_hid_interface("gyro");
-    const outcome result = inspect("nobody", 2);
-    EXPECT_EQ(without_addresses(result.out),
-              "sensor nobody doesn't provide sensor info (kr=e00002f0)\n\n"
-              "Available HID services: accel gyro \n" +
-                  nothing_matches);
-    EXPECT_EQ(result.err, "");
-    EXPECT_EQ(list_for("nobody").out, "Available HID services: accel gyro \n" + nothing_matches);
+// What it prints: the line of the list, then which service each look-up finds.
+std::string list_text(const std::string& list, const std::string& name, int prefixed, int bare) {
+    return list + "\nMatching WQR_" + name.substr(0, 123) + " [0x*, " + std::to_string(prefixed) +
+           "]\nMatching " + name + " [0x*, " + std::to_string(bare) + "]\n\n\n\n";
 }
 
-TEST_F(hid_service_list, is_empty_without_any_and_shows_what_each_look_up_finds) {
-    EXPECT_EQ(list_for("nobody").out, "Available HID services: \n" + nothing_matches);
-    const std::string label = "Available HID services: \n";
-    put_service(host, "accel", 1);
-    EXPECT_EQ(list_for("accel").out, label +
-                                         "Matching WQR_accel [0x*, 0]\n"
-                                         "Matching accel [0x*, 1]\n\n\n\n");
-    put_service(host, "WQR_accel", 2);
-    EXPECT_EQ(list_for("accel").out, label +
-                                         "Matching WQR_accel [0x*, 2]\n"
-                                         "Matching accel [0x*, 3]\n\n\n\n");
+const std::string label = "Available HID services: ";
+
+TEST_F(hid_service_list, follows_the_reason_if_there_is_no_such_service) {
+    put_hid_interfaces({"accel"});
+    put_service(host, "stranger", 3);
+    put_hid_interfaces({"gyro"});
+    const outcome result = inspect("nobody", 2);
+    EXPECT_EQ(without_addresses(result.out),
+              "sensor nobody doesn't provide sensor info (kr=e00002f0)\n\n" +
+                  list_text(label + "accel gyro ", "nobody", 0, 0));
+    EXPECT_EQ(result.err, "");
+}
+
+TEST_F(hid_service_list, shows_what_each_look_up_finds) {
+    EXPECT_EQ(list_for("nobody").out, list_text(label, "nobody", 0, 0));
+    put_service(host, "WQR_accel", 31);
+    EXPECT_EQ(list_for("accel").out, list_text(label, "accel", 1, 0));
+    put_service(host, "accel", 2);
+    EXPECT_EQ(list_for("accel").out, list_text(label, "accel", 2, 3));
+    host.remove("WQR_accel");
+    EXPECT_EQ(list_for("accel").out, list_text(label, "accel", 0, 4));
+    // Neither is by id, nor among the services of the list.
+    EXPECT_EQ(list_for("2").out, list_text(label, "2", 0, 0));
+    put_hid_interfaces({"gyro", "WQR_gyro"});
+    EXPECT_EQ(list_for("gyro").out, list_text(label + "gyro WQR_gyro ", "gyro", 0, 0));
 }
 
 TEST_F(hid_service_list, goes_on_with_the_look_ups_after_a_failure) {
-    put_hid_interface("accel");
-    put_hid_interface("gyro");
-    put_hid_interface("compass");
-    host.fail_call(1, failure::io);
-    const outcome unlisted = list_for("nobody");
-    EXPECT_EQ(unlisted.out, "Can't enumerate HID services\n" + nothing_matches);
-    EXPECT_EQ(unlisted.err, reported);
-    host.fail_call(3, failure::not_found);
-    const outcome unnamed = list_for("nobody");
-    EXPECT_EQ(unnamed.out,
-              "Available HID services: accel Can't enumerate HID services\n" + nothing_matches);
-    EXPECT_EQ(unnamed.err, reported);
+    put_hid_interfaces({"accel", "gyro", "compass"});
+    const std::string no_list = "Can't enumerate HID services";
+    for (const auto& [call, how, list] :
+         {std::tuple{1U, failure::io, no_list},
+          std::tuple{3U, failure::not_found, label + "accel " + no_list}}) {
+        host.fail_call(call, how);
+        const outcome result = list_for("nobody");
+        EXPECT_EQ(result.out, list_text(list, "nobody", 0, 0));
+        EXPECT_EQ(result.err,
+                  failure_line("nrxtoollib", "kr == 0", "nrxctl/inspection/hid_service_list.cpp"));
+    }
 }
 
 TEST_F(hid_service_list, releases_each_service_once_its_name_is_known) {
-    put_hid_interface("accel");
-    put_hid_interface("gyro");
+    put_hid_interfaces({"accel", "gyro"});
     list_for("nobody");
     const auto& log = host.log();
     ASSERT_GE(log.size(), 5U);
@@ -86,13 +86,11 @@ TEST_F(hid_service_list, releases_each_service_once_its_name_is_known) {
 TEST_F(hid_service_list, cuts_a_long_name_behind_the_prefix_alone) {
     for (const std::size_t length : {123U, 124U, 200U}) {
         const std::string name(length, 'n');
-        EXPECT_EQ(list_for(name).out,
-                  "Available HID services: \n"
-                  "Matching WQR_" +
-                      std::string(123, 'n') + " [0x*, 0]\nMatching " + name + " [0x*, 0]\n\n\n\n");
+        EXPECT_EQ(list_for(name).out, list_text(label, name, 0, 0));
     }
     put_service(host, "WQR_" + std::string(123, 'n'), 1);
-    EXPECT_NE(list_for(std::string(150, 'n')).out.find(" [0x*, 1]\nMatching n"), std::string::npos);
+    const std::string name(150, 'n');
+    EXPECT_EQ(list_for(name).out, list_text(label, name, 1, 0));
 }
 
 }  // namespace tests

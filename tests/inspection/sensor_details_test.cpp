@@ -1,94 +1,106 @@
-// Registers and performance counters.
-#include "nrxctl/inspection/perf_counters.h"
-#include "nrxctl/inspection/register_list.h"
+// Clients, registers and performance counters.
+#include <algorithm>
+
+#include "nrxctl/inspection/client_table.h"
 #include "tests/inspection/sensor_host.h"
 
 namespace tests {
 
 using namespace std::string_view_literals;
 
-class sensor_details : public device_test {
-protected:
-    outcome registers(const byte_list& list) {
-        sensor_.set_report(0x38, list);
-        return capture([] { nrx::print_register_list("accel"); });
+using sensor_details = sensor_test;
+
+TEST_F(sensor_details, clients_of_a_service_that_is_missing_are_no_table) {
+    const outcome result = capture([] { nrx::print_client_table("=", "gyro"); });
+    EXPECT_EQ(result.out, "");
+    EXPECT_EQ(result.err, failure_line("nrxtoollib", "service", "nrxctl/base/channel.cpp"));
+}
+
+TEST_F(sensor_details, clients_up_to_the_last_whole_entry) {
+    const byte_list one = client_entry("a", {1, 2, 3, 4}, 1, 0, 5);
+    byte_list entries;
+    std::string rows =
+        "=name                                report    batch threshold timelimit options power\n";
+    for (std::size_t size = 0; size <= 16 * one.size(); ++size) {
+        if (size > 0 && size % one.size() == 0) {
+            rows +=
+                "=a                               :        1        2         3         4       "
+                "      5\n";
+        }
+        const outcome result = capture([&] { nrx::print_clients("=", entries); });
+        EXPECT_EQ(result.out, rows) << size;
+        EXPECT_EQ(result.err, "");
+        entries.push_back(one[size % one.size()]);
     }
+}
 
-    outcome counters(const byte_list& reply) {
-        sensor_.set_report(0x31, reply);
-        return capture([] { nrx::print_perf_counters("accel"); });
-    }
-
-    interface_driver& sensor_ = put_service(host, "accel", 31);
-};
-
+const std::string whole_registers = "R0f=a0 R10=abc ";
 const std::string list_too_short = failure_line(
     "nrxtoollib", "size >= sizeof(NrxRegisterList) + list->count*sizeof(list->regs[0])",
     "nrxctl/inspection/register_list.cpp");
 
 TEST_F(sensor_details, registers_in_at_least_two_digits) {
-    EXPECT_EQ(registers(bytes_of("\3\0\0\0\0\0\x0f\0\x10\0\xff\0\xff\xff\0\1"sv)).out,
-              "SensorRegs  : R00=0f R10=ff Rffff=100 \n");
-    EXPECT_EQ(registers(bytes_of("\1\0\0\0\1\0\2\0\3\0\4\0"sv)).out, "SensorRegs  : R01=02 \n");
-    EXPECT_EQ(registers(bytes_of("\0\0\0\0"sv)).out, "SensorRegs  : \n");
+    expect_changes("als", {{0x38, bytes_of("\3\0\0\0\0\0\x0f\0\x10\0\xff\0\xff\xff\0\1"sv),
+                            whole_registers, "R00=0f R10=ff Rffff=100 "},
+                           {0x38, words({1, 0x20001, 0x40003}), whole_registers, "R01=02 "},
+                           {0x38, words({0}), whole_registers, ""}});
 }
 
 TEST_F(sensor_details, a_list_of_more_registers_than_came_back_is_reported_instead) {
-    const auto expect_refused = [&](const byte_list& list) {
-        const outcome result = registers(list);
-        EXPECT_EQ(result.out, "SensorRegs  : \n");
-        EXPECT_EQ(result.err, list_too_short);
-    };
-    const byte_list two = bytes_of("\2\0\0\0\1\0\2\0\3\0\4\0"sv);
-    for (std::size_t size = 0; size < two.size(); ++size)
-        expect_refused({two.begin(), two.begin() + static_cast<std::ptrdiff_t>(size)});
-    EXPECT_EQ(registers(two).err, "");
-    for (const std::int64_t count : {0x40000000, 0x40000001, 0x7fffffff}) {
-        byte_list list = words({count});
-        list.resize(1024);
-        expect_refused(list);
+    std::vector<byte_list> lists{words({0xffffffff, 1, 2, 3})};
+    for (const std::int64_t count : {256, 0x40000000, 0x40000001, 0x7fffffff}) {
+        lists.push_back(words({count}));
+        lists.back().resize(1024);
     }
-    byte_list list = words({0xffffffff, 1, 2, 3});
-    expect_refused(list);
-    list = words({255});
-    list.resize(1024);
-    EXPECT_EQ(registers(list).err, "");
+    for (std::size_t size = 0; size < 12; ++size)
+        lists.push_back(first_bytes(words({2, 0x20001, 0x40003}), size));
+    for (const byte_list& list : lists)
+        expect_changes("als", {{0x38, list, whole_registers, "", list_too_short}});
 }
+
+const std::string whole_counters = "cycles: 16777216 allmisse: -1 ";
 
 TEST_F(sensor_details, counters_only_of_a_monitor_in_automatic_mode) {
-    const std::string label = "APPerfmon   : ";
-    EXPECT_EQ(counters(words({0})).out, label + "perfmon is not supported\n");
-    for (const std::int64_t mode : {0, 1, 3, 0x102, -2}) {
-        sensor_.set_report(0x26, words({mode}));
-        EXPECT_EQ(counters(words({0})).out, label + "perfmon is not in auto mode\n");
-    }
-    sensor_.set_report(0x26, words({2}));
-    EXPECT_EQ(counters(words({0})).out, label + "\n");
-    sensor_.drop_report(0x31);
-    const outcome unread = capture([] { nrx::print_perf_counters("accel"); });
-    EXPECT_EQ(unread.out, "");
-    EXPECT_EQ(unread.err,
-              failure_line("nrxtoollib", "kr == 0 ", "nrxctl/inspection/perf_counters.cpp",
-                           "unsupported request (0xe00002c7)"));
+    expect_changes("als", {{0x26, {}, whole_counters, "perfmon is not supported"}});
+    for (const std::int64_t mode : {0, 1, 3, 0x102, -2})
+        expect_changes("als",
+                       {{0x26, words({mode}), whole_counters, "perfmon is not in auto mode"}});
 }
 
-TEST_F(sensor_details, counters_up_to_the_last_that_came_back_whole) {
-    sensor_.set_report(0x26, words({2}));
-    const std::string_view entry = "counter\0\7\0\0\0////////////"sv;
-    for (std::size_t size = 0; size <= 52; ++size) {
-        byte_list reply = words({0xffffffff});
-        reply.insert(reply.end(), entry.begin(), entry.end());
-        reply.insert(reply.end(), entry.begin(), entry.end());
-        reply.resize(size);
-        const outcome result = counters(reply);
-        EXPECT_EQ(result.out, std::string("APPerfmon   : ") + (size >= 28 ? "counter: 7 " : "") +
-                                  (size >= 52 ? "counter: 7 " : "") + "\n")
-            << size;
-        EXPECT_EQ(result.err, size < 4 ? too_short(4, "perf_counters.cpp") : "") << size;
+TEST_F(sensor_details, counters_as_many_as_are_counted_and_came_back_whole) {
+    const auto repeated = [](std::string_view text, std::size_t count) {
+        std::string all;
+        for (; count > 0; --count)
+            all += text;
+        return all;
+    };
+    for (const std::size_t count : {0U, 1U, 10U, 11U, 0xffffffffU}) {
+        byte_list reply = words({static_cast<std::int64_t>(count)});
+        reply.resize(256, 'n');
+        expect_changes("als",
+                       {{0x31, reply, whole_counters,
+                         repeated("nnnnnnnn: 1852730990 ", std::min<std::size_t>(count, 10))}});
     }
-    byte_list more = words({1});
-    more.resize(256, 'n');
-    EXPECT_EQ(counters(more).out, "APPerfmon   : nnnnnnnn: 1852730990 \n");
+    const byte_list huge =
+        bytes_of("\xff\xff\xff\xff" + repeated("counter\0\7\0\0\0////////////"sv, 2));
+    for (std::size_t size = 0; size <= huge.size(); ++size) {
+        expect_changes("als", {{0x31, first_bytes(huge, size), whole_counters,
+                                repeated("counter: 7 ", size < 4 ? 0 : (size - 4) / 24),
+                                size < 4 ? too_short(4, "perf_counters.cpp") : ""}});
+    }
+}
+
+TEST_F(sensor_details, of_which_two_fail_are_followed_by_the_rest) {
+    interface_driver& sensor = put_whole_sensor(host, "als");
+    sensor.set_report(0x38, words({2, 0x20001}));
+    sensor.drop_report(0x31);
+    const outcome result = inspect("als", 2);
+    const std::string whole = whole_text("als", 2);
+    EXPECT_EQ(result.out,
+              whole.substr(0, whole.find(whole_registers)) + "\n" + event_line + "\n\n");
+    EXPECT_EQ(result.err, list_too_short + failure_line("nrxtoollib", "kr == 0 ",
+                                                        "nrxctl/inspection/perf_counters.cpp",
+                                                        "unsupported request (0xe00002c7)"));
 }
 
 }  // namespace tests

@@ -1,5 +1,7 @@
 #include "tests/inspection/sensor_host.h"
 
+#include <map>
+
 #include "nrxctl/inspection/sensor_info.h"
 
 namespace tests {
@@ -36,6 +38,10 @@ byte_list bytes_of(std::string_view text) {
     return {text.begin(), text.end()};
 }
 
+byte_list first_bytes(const byte_list& whole, std::size_t length) {
+    return {whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(length)};
+}
+
 byte_list client_entry(std::string_view name, std::initializer_list<std::int64_t> numbers,
                        std::uint8_t in_use, std::uint8_t option, std::uint8_t power) {
     byte_list entry = bytes_of(name);
@@ -45,21 +51,6 @@ byte_list client_entry(std::string_view name, std::initializer_list<std::int64_t
         append(entry, number);
     entry.insert(entry.end(), {in_use, option, power});
     return entry;
-}
-
-void set_clients(interface_driver& sensor, const byte_list& entries) {
-    sensor.set_command(0x39, [entries](platform::byte_view payload, byte_list& reply) {
-        if (!payload.empty()) return platform::bad_argument;
-        reply = entries;
-        return platform::success;
-    });
-}
-
-const std::vector<std::uint32_t>& property_ids() {
-    static const std::vector<std::uint32_t> ids{0x00, 0x33, 0x40, 0x22, 0x23, 0x24, 0x43,
-                                                0x0a, 0x0d, 0x0f, 0x10, 0x0b, 0x1a, 0x18,
-                                                0x3f, 0x2d, 0x19, 0x3d, 0x44};
-    return ids;
 }
 
 interface_driver& put_whole_sensor(machine& host, std::string_view name) {
@@ -73,60 +64,65 @@ interface_driver& put_whole_sensor(machine& host, std::string_view name) {
     interface_driver& sensor = put_service(host, name, 31);
     for (const row& report : {
              row{0x00, words({10'000})},
-             row{0x33, words({2'500})},
-             row{0x40, words({1'250})},
-             row{0x22, words({1})},
+             row{0x33, words({-250'000})},
+             row{0x40, words({125'000})},
+             row{0x22, words({0x10000})},
              row{0x23, words({0})},
              row{0x24, words({0x100})},
-             row{0x43, words({11, 12, 13, 14, -15})},
+             row{0x43, words({-110'000, -120'000, -130'000, -140'000, -150'000})},
              row{0x0a, words({0})},
-             row{0x0d, words({0x80})},
+             row{0x0d, words({INT32_MIN})},
              row{0x0f, bytes_of("Maker\0rest"sv)},
              row{0x10, bytes_of("M-1\0rest"sv)},
              row{0x0b, matrix},
              row{0x1a, words({1, -2, INT32_MAX})},
              row{0x18, {1, 0xff, 0, 0, 127, 128, 2, 3, 4}},
              row{0x3f, words({10'000, 5'000, 3})},
-             row{0x2d, words({21})},
-             row{0x19, words({-22})},
+             row{0x2d, words({-210'000})},
+             row{0x19, words({-220'000})},
              row{0x3d, words({2})},
-             row{0x44, {'L', 0xf9, 0xff, 0xff, 0xff}},
-             row{0x06, words({8})},
-             row{0x36, words({2, 4, -8})},
-             row{0x04, words({50})},
+             row{0x44, {'L', 0, 0, 0xff, 0xff}},
+             row{0x06, words({-80'000})},
+             row{0x36, words({2, 70'000, -8})},
+             row{0x04, words({-1})},
              row{0x37, words({25, 0})},
              row{0x1d, matrix},
              row{0xd6, words({0x18000, -0x10000, 0})},
-             row{0x39, bytes_of("\4\0\xff\0\0\0\3\2ok\0"sv)},
-             row{0x3a, bytes_of("\0\xff\xff\xff\xff\5\2 \0\1\0\0\0\0\1\0\0\0"sv)},
-             row{0x3b, {}},
-             row{0x3c, {9, 'A'}},
+             row{0x39, bytes_of("\0\x0a\0\0\0\4\0\xff\0\0\0\3\2ok\0"sv)},
+             row{0x3a, bytes_of("\0\xff\xff\xff\xff\5\2 \0\1\0\0\0\0\1\0\0\0\4"sv)},
+             row{0x3b, {9, 'A'}},
+             row{0x3c, bytes_of("\0\x0c\0\0\0"sv)},
              row{0x38, bytes_of("\2\0\0\0\x0f\0\xa0\0\x10\0\xbc\x0a"sv)},
              row{0x26, words({2})},
              row{0x31, bytes_of("\2\0\0\0"
-                                "cycles\0x\x2a\0\0\0............"
+                                "cycles\0x\0\0\0\1............"
                                 "allmisse\xff\xff\xff\xff............"sv)},
          }) {
         sensor.set_report(report.id, report.bytes);
     }
-    byte_list clients = client_entry("system", {10'000, 20'000, -3, 40'000}, 1, 0, 7);
+    byte_list clients = client_entry("system", {-1'000'000, -200'000, -300'000, 40'000}, 1, 0, 7);
     for (const byte_list& further :
          {client_entry("gone", {1, 2, 3, 4}, 0, 1, 1),
           client_entry("twelve chars and more", {5, 6, 7, INT32_MIN}, 9, 8, 255)}) {
         clients.insert(clients.end(), further.begin(), further.end());
     }
-    clients.resize(93);
-    set_clients(sensor, clients);
+    sensor.set_command(0x39, [clients](platform::byte_view, byte_list& reply) {
+        reply = clients;
+        return platform::success;
+    });
     put_events(host, name);
     return sensor;
 }
 
-const std::string whole_summary =
+namespace {
+
+const std::string summary =
     "Device      : Maker M-1\n"
-    "Location    : 'L' alternate=-7\n"
-    "Sample intvl: 10000 us, hw=2500 decimation=enabled\n"
-    "Systck intvl: 1250 us\n"
-    "Batching    : sensor=11 mux=12 ap_batch=13 ap_report=14 (-15 samples in endpoint)\n"
+    "Location    : 'L' alternate=-65536\n"
+    "Sample intvl: 10000 us, hw=-250000 decimation=enabled\n"
+    "Systck intvl: 125000 us\n"
+    "Batching    : sensor=-110000 mux=-120000 ap_batch=-130000 ap_report=-140000 "
+    "(-150000 samples in endpoint)\n"
     "Sensor mode : factory\n"
     "Filter      : enabled fixedOdr=disabled\n"
     "Calibrated  : sysconfig\n"
@@ -135,27 +131,53 @@ const std::string whole_summary =
     "Cal offset  : 1 -2 2147483647\n"
     "Orient. m.  : 1 -1 0, 0 127 -128, 2 3 4\n"
     "SampleRates : 100.00 200.00 333333.33 \n"
-    "StartupTime : 21\n"
-    "intCal      : -22 [at 100Hz]\n";
+    "StartupTime : -210000\n"
+    "intCal      : -220000 [at 100Hz]\n";
 
-const std::string whole_details =
+const std::map<std::string, std::string, std::less<>> motion_lines{
+    {"accel",
+     "fsr         : -80000\n"
+     "SupportedFSR: 2 70000 -8 \n"
+     "bw          : -1\n"
+     "SupportedBW : 25 0 \n"},
+    {"gyro",
+     "range       : -80000\n"
+     "SupportedRanges: 2 70000 -8 \n"},
+    {"compass",
+     "Sensitivity : 1.000000 -0.500000 0.250000 | 0.125000 2.000000 -3.000000 | "
+     "0.000015 32767.999985 -32768.000000\n"
+     "Compensation: 1.500000 -1.000000 0.000000\n"},
+};
+
+const std::string details =
     "Clients     : name                                report    batch threshold timelimit options "
     "power\n"
-    "Clients     : system                          :    10000    20000        -3     40000        "
+    "Clients     : system                          : -1000000  -200000   -300000     40000        "
     "     7\n"
     "Clients     : twelve chars                    :        5        6         7 -2147483648       "
     "d   255\n"
-    "ExtraInfo   : ff\n"
+    "ExtraInfo   : 10ff\n"
     "ExtraInfo   : ok\n"
     "ExtraInfo   : ffffffff 4294967296\n"
-    "ExtraInfo   : \n"
     "ExtraInfo   : \n"
     "data error\n"
     "00000000: 09 41                                             | .A\n"
     "\n"
+    "ExtraInfo   : c\n"
     "SensorRegs  : R0f=a0 R10=abc \n"
-    "APPerfmon   : cycles: 42 allmisse: -1 \n"
+    "APPerfmon   : cycles: 16777216 allmisse: -1 \n";
+
+}  // namespace
+
+const std::string event_line =
     "APEvents    : 77 [enqueued=75 dropped=2; event_delta=1.500000 dropped_delta=62.000001]\n";
+
+std::string whole_text(std::string_view name, std::int32_t level) {
+    std::string text = "Sensor type : " + std::string(name) + "\n" + summary;
+    if (const auto own = motion_lines.find(name); own != motion_lines.end()) text += own->second;
+    if (level == 2) text += details + event_line;
+    return text + "\n\n";
+}
 
 std::string too_short(std::size_t needed, std::string_view file) {
     return failure_line("nrxtoollib", "length >= " + std::to_string(needed),
@@ -164,6 +186,22 @@ std::string too_short(std::size_t needed, std::string_view file) {
 
 outcome inspect(std::string_view name, std::int32_t level) {
     return capture([&] { nrx::print_sensor_info(name, level); });
+}
+
+void sensor_test::expect_changes(std::string_view name, const std::vector<change>& changes) {
+    for (const change& one : changes) {
+        interface_driver& sensor = put_whole_sensor(host, name);
+        sensor.drop_report(one.id);
+        if (one.bytes) sensor.set_report(one.id, *one.bytes);
+        std::string expected = whole_text(name, 2);
+        const std::size_t at = expected.find(one.text);
+        ASSERT_NE(at, std::string::npos) << one.text;
+        expected.replace(at, one.text.size(), one.changed);
+        const outcome result = inspect(name, 2);
+        EXPECT_EQ(result.out, expected) << one.id;
+        EXPECT_EQ(result.err, one.err) << one.id;
+        host.remove(name);
+    }
 }
 
 }  // namespace tests

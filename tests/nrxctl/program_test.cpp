@@ -99,16 +99,27 @@ TEST(nrxctl_program, shows_a_sensor_at_level_1_unless_told_otherwise) {
     EXPECT_EQ(summary.err, "");
     EXPECT_TRUE(summary.out.starts_with("Sensor type : gyro\nDevice      : "));
     EXPECT_TRUE(summary.out.ends_with("\nSupportedRanges: 250 500 1000 2000 \n\n\n"));
-    EXPECT_EQ(run({"--sensor", "gyro", "1"}).out, summary.out);
     const auto detailed = run({"--sensor", "gyro", "2", "--version"});
     EXPECT_EQ(detailed.err, "");
-    const std::string details =
-        summary.out.substr(0, summary.out.size() - 2) + "Clients     : name  ";
-    EXPECT_EQ(detailed.out.substr(0, details.size()), details);
+    EXPECT_TRUE(
+        detailed.out.starts_with(summary.out.substr(0, summary.out.size() - 2) + "Clients "));
     EXPECT_TRUE(detailed.out.ends_with("]\n\n\nnrxctl " NRXCTL_VERSION "\n"));
     const auto unknown = run({"--sensor", "nobody"});
     EXPECT_EQ(unknown.status, 0);
     EXPECT_NE(unknown.out.find("\nAvailable HID services: accel gyro "), std::string::npos);
+}
+
+TEST(nrxctl_program, writes_a_sensor_one_line_at_a_time) {
+    for (const char* name : {"accel", "nobody"}) {
+        const auto writes = tests::writes_of(program, {"--sensor", name, "2"});
+        EXPECT_GE(writes.size(), 5U);
+        for (const std::string& text : writes) {
+            // Some lines are followed by empty ones.
+            const std::size_t end = text.find('\n');
+            EXPECT_NE(end, std::string::npos) << text;
+            EXPECT_EQ(text.find_first_not_of('\n', end), std::string::npos) << text;
+        }
+    }
 }
 
 TEST(nrxctl_program, reads_writes_and_commands_and_tells_by_its_status_whether_all_went_well) {
