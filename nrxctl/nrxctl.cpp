@@ -1,17 +1,16 @@
-// nrxctl: the entry points of the tool library at a person's hand.
+// nrxctl: the entry points of the tool library as command-line options.
 
-#include <algorithm>
 #include <array>
 #include <cstdlib>
 #include <getopt.h>
-#include <limits>
 #include <span>
 #include <string>
-#include <vector>
 
 #include "nrxctl/nrxtoollib.h"
 #include "nrxctl/options/driver_options.h"
+#include "nrxctl/options/family_options.h"
 #include "nrxctl/options/option_words.h"
+#include "nrxctl/options/service_options.h"
 #include "nrxctl/options/watch_options.h"
 #include "platform/clock.h"
 
@@ -20,88 +19,6 @@ namespace {
 using namespace nrx;
 
 constexpr int misuse_status = 2;
-constexpr std::size_t usual_report_capacity = 65'536;
-constexpr std::size_t largest_report_capacity = 1 << 20;
-
-std::uint32_t parse_report_id(std::string_view word) {
-    return parse_number_up_to(std::numeric_limits<std::uint8_t>::max(), word,
-                              "report id is invalid");
-}
-
-outcome profile(const option_words& words) {
-    profile_command(words.argument, words.all, words.index);
-    return outcome::done;
-}
-
-outcome scm(const option_words& words) {
-    scm_monitor(words.argument, words.all, words.index);
-    return outcome::done;
-}
-
-// The command takes the words before the next option, and leaves those aside that it does not need.
-outcome replay(const option_words& words) {
-    const auto further = words.all.subspan(static_cast<std::size_t>(words.index));
-    const auto end = std::find_if(further.begin(), further.end(),
-                                  [](std::string_view word) { return word.starts_with("--"); });
-    const auto own = words.all.first(static_cast<std::size_t>(end - words.all.begin()));
-    replay_command(words.argument, own, words.index);
-    words.index = static_cast<int>(own.size());
-    return outcome::done;
-}
-
-outcome show_sensor(const option_words& words) {
-    std::uint32_t level = 1;
-    if (const auto word = words.take()) {
-        level =
-            parse_number_up_to(std::numeric_limits<std::int32_t>::max(), *word, "level is invalid");
-    }
-    print_sensor_info(words.argument, static_cast<std::int32_t>(level));
-    return outcome::done;
-}
-
-outcome list(const option_words& /*words*/) {
-    return outcome_of(list_services());
-}
-
-outcome read_report(const option_words& words) {
-    const auto id_word = words.take();
-    if (!id_word) return outcome::misused;
-    const std::uint32_t id = parse_report_id(*id_word);
-    std::size_t capacity = usual_report_capacity;
-    if (const auto word = words.take()) {
-        capacity = parse_number_up_to(largest_report_capacity, *word, "capacity is invalid");
-    }
-    std::vector<std::uint8_t> buffer(capacity);
-    platform::byte_span report = buffer;
-    const platform::return_code result = get_report(words.argument, id, report);
-    if (result != platform::success) return outcome::failed;
-    print_report(words.argument, static_cast<std::int32_t>(id), report);
-    return outcome::done;
-}
-
-outcome write_report(const option_words& words) {
-    const auto id_word = words.take();
-    if (!id_word) return outcome::misused;
-    const std::uint32_t id = parse_report_id(*id_word);
-    std::vector<std::uint8_t> payload;
-    parse_payload(words.all, words.index, payload);
-    if (payload.empty()) return outcome::misused;
-    return outcome_of(set_report(words.argument, id, payload));
-}
-
-outcome run_command(const option_words& words) {
-    const auto code_word = words.take();
-    if (!code_word) return outcome::misused;
-    const std::uint32_t code = parse_number_up_to(std::numeric_limits<std::uint32_t>::max(),
-                                                  *code_word, "command code is invalid");
-    std::vector<std::uint8_t> payload;
-    parse_payload(words.all, words.index, payload);
-    std::vector<std::uint8_t> buffer(usual_report_capacity);
-    platform::byte_span reply = buffer;
-    const platform::return_code result = send_command(words.argument, code, payload, reply);
-    if (result == platform::success) hex_dump(reply);
-    return outcome_of(result);
-}
 
 outcome help(const option_words& words);
 

@@ -23,6 +23,11 @@
 #include "nrxctl/printers/spi_status.h"
 #include "nrxctl/printers/value_printers.h"
 
+// Event records as text
+#include "nrxctl/decoders/profile_hexdump.h"
+#include "nrxctl/decoders/record_text.h"
+#include "nrxctl/decoders/scm_packets.h"
+
 // The profiler
 #include "nrxctl/profiler/profile_command.h"
 #include "nrxctl/profiler/scm_monitor.h"

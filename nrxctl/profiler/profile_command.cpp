@@ -4,7 +4,7 @@
 
 #include "nrxctl/base/argument_words.h"
 #include "nrxctl/base/output.h"
-#include "nrxctl/base/word_table.h"
+#include "nrxctl/base/subcommand_table.h"
 #include "nrxctl/profiler/interrupt_stop.h"
 #include "nrxctl/profiler/subcommands.h"
 
@@ -31,11 +31,6 @@ void help(argument_words& /*words*/) {
         print_line(line);
 }
 
-struct subcommand_row {
-    std::string_view word;
-    void (*run)(argument_words& words);
-};
-
 constexpr std::array subcommands{
     subcommand_row{"help", help},
     subcommand_row{"clear-eventsources", profile::clear_event_source_statistics},
@@ -60,10 +55,7 @@ constexpr std::array subcommands{
 void profile_command(std::string_view subcommand, std::span<char* const> words, int& index) {
     const interrupt_stop stop_while_running;
     argument_words further(words, index);
-    if (const subcommand_row* known = find_word_row(subcommands, subcommand)) {
-        known->run(further);
-        return;
-    }
+    if (run_subcommand(subcommands, subcommand, further)) return;
     further.put_first(subcommand);
     profile::run_profile(further);
 }

@@ -10,6 +10,7 @@
 #include "nrxctl/base/service_conn.h"
 #include "nrxctl/base/service_discovery.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/word_table.h"
 #include "nrxctl/replay/replay_app.h"
 #include "nrxctl/replay/replay_state.h"
 #include "nrxctl/replay/sample_file.h"
@@ -48,9 +49,8 @@ constexpr std::array locations{
 bool read_option(std::optional<std::string_view> word, std::span<const option_word> known,
                  std::string_view refusal, std::uint32_t& value) {
     if (!word) return true;
-    const auto row = std::find_if(known.begin(), known.end(),
-                                  [&](const option_word& one) { return one.word == *word; });
-    if (row == known.end()) {
+    const option_word* row = find_word_row(known, *word);
+    if (row == nullptr) {
         print_line(text_line().text(refusal).text(": ").text(*word).view());
         return false;
     }

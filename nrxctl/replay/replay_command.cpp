@@ -1,10 +1,10 @@
 #include "nrxctl/replay/replay_command.h"
 
-#include <algorithm>
 #include <array>
 
 #include "nrxctl/base/argument_words.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/subcommand_table.h"
 #include "nrxctl/base/text_line.h"
 #include "nrxctl/replay/signal_request.h"
 #include "nrxctl/replay/subcommands.h"
@@ -35,11 +35,6 @@ void generate(argument_words& words) {
     if (const auto request = read_signal_request(words)) generate_samples(*request);
 }
 
-struct subcommand_row {
-    std::string_view word;
-    void (*run)(argument_words& words);
-};
-
 constexpr std::array subcommands{
     subcommand_row{"help", help},
     subcommand_row{"load", replay::load},
@@ -60,13 +55,7 @@ void print_replay_usage() {
 
 void replay_command(std::string_view subcommand, std::span<char* const> words, int& index) {
     argument_words further(words, index);
-    const auto* row =
-        std::find_if(subcommands.begin(), subcommands.end(),
-                     [&](const subcommand_row& known) { return known.word == subcommand; });
-    if (row != subcommands.end()) {
-        row->run(further);
-        return;
-    }
+    if (run_subcommand(subcommands, subcommand, further)) return;
     print_line(text_line().text("Invalid subcommand ").text(subcommand).text("\n").view());
     print_replay_usage();
 }

@@ -14,10 +14,6 @@ using simulated::machine;
 
 namespace {
 
-std::string name_of(const entry_ref& provider) {
-    return provider ? provider->name : "nothing";
-}
-
 std::string hexadecimal(std::uint64_t value) {
     constexpr std::string_view digits = "0123456789abcdef";
     std::string text;

@@ -16,10 +16,6 @@ using simulated::queue_mapping;
 
 namespace {
 
-std::string name_of(const entry_ref& provider) {
-    return provider ? provider->name : "nothing";
-}
-
 std::string name_of(machine& host, handle_id id) {
     const queue_mapping* mapping = host.mapping(id);
     return name_of(mapping != nullptr ? mapping->provider : nullptr);

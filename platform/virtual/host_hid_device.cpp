@@ -33,8 +33,7 @@ void hid_device_kind::release(handle_id id) {
 hid_device create_hid_device(const service& provider) {
     machine& host = current_machine();
     const entry_ref entry = host.service(provider.id());
-    const auto how =
-        host.begin_call([&] { return "create hid device " + (entry ? entry->name : "nothing"); });
+    const auto how = host.begin_call([&] { return "create hid device " + name_of(entry); });
     if (how || !entry || !entry->present || !entry->hid) return {};
     return hid_device(host.lend_hid_device(entry));
 }

@@ -16,10 +16,6 @@ using simulated::record_listener;
 
 namespace {
 
-std::string name_of(const entry_ref& provider) {
-    return provider ? provider->name : "nothing";
-}
-
 std::string name_of(const std::shared_ptr<record_listener>& listener) {
     return listener ? listener->provider->name : "nothing";
 }

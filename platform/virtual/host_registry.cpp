@@ -18,10 +18,6 @@ namespace {
 
 constexpr std::size_t longest_entry_name = 127;
 
-std::string name_of(const entry_ref& entry) {
-    return entry ? entry->name : "nothing";
-}
-
 // The entries that a look-up has to consider, in registration order.
 const std::vector<entry_ref>& possible_matches(const machine& host, const dictionary& matching) {
     const property* name = matching.find(provider_class_key);
@@ -35,10 +31,6 @@ void service_kind::release(handle_id id) {
     machine& host = current_machine();
     host.note([&] { return "release " + name_of(host.service(id)); });
     host.take_back(id);
-}
-
-dictionary matching_class(std::string_view class_name) {
-    return {{std::string(provider_class_key), class_name}};
 }
 
 service first_match(const dictionary& matching) {

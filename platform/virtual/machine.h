@@ -24,6 +24,11 @@ namespace platform::simulated {
 
 using entry_ref = std::shared_ptr<entry>;
 
+// An entry in the words of the call log.
+inline std::string name_of(const entry_ref& one) {
+    return one ? one->name : "nothing";
+}
+
 // A HID device object that a client holds.
 struct hid_object {
     entry_ref provider;
