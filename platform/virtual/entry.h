@@ -25,4 +25,11 @@ struct entry {
     bool present = true;                                // false once the service is gone
 };
 
+using entry_ref = std::shared_ptr<entry>;
+
+// An entry in the words of the call log.
+inline std::string name_of(const entry_ref& one) {
+    return one ? one->name : "nothing";
+}
+
 }  // namespace platform::simulated

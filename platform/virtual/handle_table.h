@@ -1,56 +1,86 @@
-// The objects of one kind that are lent out.
+// What a virtual host has lent out.
 #pragma once
 
-#include <algorithm>
 #include <cstddef>
-#include <utility>
+#include <memory>
+#include <variant>
 #include <vector>
 
 #include "platform/handle.h"
+#include "platform/virtual/entry.h"
+#include "platform/virtual/listeners.h"
+#include "platform/virtual/shared_queue.h"
 
 namespace platform::simulated {
 
+// What stands behind a handle, kind by kind.
+struct lent_service {
+    entry_ref provider;
+};
+struct lent_connection {
+    entry_ref provider;
+};
+struct lent_mapping {
+    entry_ref provider;
+    std::shared_ptr<shared_queue> queue;
+};
+struct lent_port {
+    std::shared_ptr<shared_queue> queue;  // that signals its data on the port; null if none does
+};
+struct lent_hid_device {
+    entry_ref provider;
+    bool is_open = false;
+};
+struct lent_hid_plugin {
+    entry_ref provider;
+};
+struct lent_hid_interface {
+    std::shared_ptr<record_listener> listener;
+};
+struct lent_hid_event_client {
+    std::shared_ptr<event_listener> listener;
+};
+struct lent_hid_services {
+    std::vector<entry_ref> services;
+};
+
 // A program holds few objects at once, and gives back first what it took last; so they stand in a
 // row, looked for from the end. Lending and taking back in turn allocates nothing.
-template <class Object>
 class handle_table {
 public:
-    // Lends an object out under a number that no object of this kind has, and returns the number.
-    handle_id lend(handle_id id, Object object) {
-        lent_.push_back({id, std::move(object)});
-        return id;
+    using object =
+        std::variant<lent_service, lent_connection, lent_mapping, lent_port, lent_hid_device,
+                     lent_hid_plugin, lent_hid_interface, lent_hid_event_client, lent_hid_services>;
+
+    // Lends an object out under a number of its own.
+    handle_id lend(object lent);
+
+    // The object of a kind with that number, until the next change of the table; null if there is
+    // none.
+    template <class Kind>
+    [[nodiscard]] Kind* find(handle_id id) {
+        object* found = find_any(id);
+        return found == nullptr ? nullptr : std::get_if<Kind>(found);
     }
 
-    // The object with that number, until the next change of the table; null if there is none.
-    [[nodiscard]] const Object* find(handle_id id) const {
-        const auto found = std::find_if(lent_.rbegin(), lent_.rend(),
-                                        [&](const one_lent& one) { return one.id == id; });
-        return found == lent_.rend() ? nullptr : &found->object;
-    }
-    [[nodiscard]] Object* find(handle_id id) {
-        return const_cast<Object*>(std::as_const(*this).find(id));
-    }
+    // Takes the object with that number back, of whichever kind, if there is one.
+    void take_back(handle_id id);
 
-    // Takes the object with that number back, if there is one.
-    void take_back(handle_id id) {
-        std::erase_if(lent_, [&](const one_lent& one) { return one.id == id; });
-    }
-
-    [[nodiscard]] std::size_t size() const { return lent_.size(); }
-
-    template <class Predicate>
-    [[nodiscard]] std::size_t count_if(Predicate holds) const {
-        return static_cast<std::size_t>(std::count_if(
-            lent_.begin(), lent_.end(), [&](const one_lent& one) { return holds(one.object); }));
-    }
+    // How many objects are out, and HID devices still open, those included whose object was taken
+    // back before they were closed.
+    [[nodiscard]] std::size_t still_open() const;
 
 private:
-    struct one_lent {
+    struct numbered_object {
         handle_id id;
-        Object object;
+        object lent;
     };
 
-    std::vector<one_lent> lent_;
+    object* find_any(handle_id id);
+
+    std::vector<numbered_object> objects_;
+    handle_id last_id_ = 0;
+    std::size_t hid_devices_left_open_ = 0;
 };
 
 }  // namespace platform::simulated

@@ -10,6 +10,8 @@ namespace platform {
 using simulated::current_machine;
 using simulated::entry_ref;
 using simulated::failure;
+using simulated::lent_connection;
+using simulated::lent_service;
 using simulated::machine;
 
 namespace {
@@ -47,27 +49,27 @@ std::string describe_call(const entry_ref& provider, std::uint32_t selector,
 
 void connection_kind::release(handle_id id) {
     machine& host = current_machine();
-    host.note([&] { return "close " + name_of(host.connection(id)); });
+    host.note([&] { return "close " + name_of(host.provider<lent_connection>(id)); });
     host.take_back(id);
 }
 
 return_code open(const service& provider, std::uint32_t type, connection& opened) {
     machine& host = current_machine();
-    const entry_ref entry = host.service(provider.id());
+    const entry_ref entry = host.provider<lent_service>(provider.id());
     const auto how =
         host.begin_call([&] { return "open " + name_of(entry) + " type " + std::to_string(type); });
     if (how) return code_of(*how);
     if (!entry || !entry->present) return not_found;
     if (!entry->unit) return unsupported;
     const return_code result = entry->unit->open(type);
-    if (result == success) opened = connection(host.lend_connection(entry));
+    if (result == success) opened = connection(host.lend(lent_connection{entry}));
     return result;
 }
 
 return_code call(const connection& connected, std::uint32_t selector, const call_inputs& inputs,
                  call_outputs& outputs) {
     machine& host = current_machine();
-    const entry_ref provider = host.connection(connected.id());
+    const entry_ref provider = host.provider<lent_connection>(connected.id());
     const auto how =
         host.begin_call([&] { return describe_call(provider, selector, inputs, outputs); });
     if (how) {

@@ -11,24 +11,26 @@ namespace platform {
 using simulated::current_machine;
 using simulated::entry_ref;
 using simulated::failure;
+using simulated::lent_connection;
+using simulated::lent_mapping;
+using simulated::lent_port;
 using simulated::machine;
-using simulated::queue_mapping;
 
 namespace {
 
 std::string name_of(machine& host, handle_id id) {
-    const queue_mapping* mapping = host.mapping(id);
+    const lent_mapping* mapping = host.lent<lent_mapping>(id);
     return name_of(mapping != nullptr ? mapping->provider : nullptr);
 }
 
-return_code check_mapping(const queue_mapping* mapping) {
+return_code check_mapping(const lent_mapping* mapping) {
     if (mapping == nullptr) return bad_argument;
     return mapping->provider->present ? success : not_found;
 }
 
 // Waits until the queue holds data, its driver is gone, or, which only the manual clock can tell,
 // nothing can ever happen any more.
-return_code wait_on(machine& host, const queue_mapping& mapping) {
+return_code wait_on(machine& host, const lent_mapping& mapping) {
     while (mapping.provider->present) {
         simulated::serve_interrupt();
         mapping.queue->catch_up();
@@ -43,7 +45,7 @@ return_code wait_on(machine& host, const queue_mapping& mapping) {
 void memory_kind::release(handle_id id) {
     machine& host = current_machine();
     host.note([&] { return "unmap " + name_of(host, id); });
-    if (const queue_mapping* mapping = host.mapping(id)) mapping->queue->unmapped();
+    if (const lent_mapping* mapping = host.lent<lent_mapping>(id)) mapping->queue->unmapped();
     host.take_back(id);
 }
 
@@ -53,21 +55,21 @@ void port_kind::release(handle_id id) {
 
 return_code map_memory(const connection& connected, std::uint32_t type, mapped_memory& mapped) {
     machine& host = current_machine();
-    const entry_ref provider = host.connection(connected.id());
+    const entry_ref provider = host.provider<lent_connection>(connected.id());
     const auto how = host.begin_call(
         [&] { return "map " + name_of(provider) + " memory " + std::to_string(type); });
     if (how) return code_of(*how);
     if (!provider || !provider->present) return not_found;
     auto queue = provider->unit->memory(type);
     if (!queue) return unsupported;
-    mapped = mapped_memory(host.lend_mapping({provider, std::move(queue)}));
+    mapped = mapped_memory(host.lend(lent_mapping{provider, std::move(queue)}));
     return success;
 }
 
 return_code attach_port(const connection& connected, std::uint32_t type,
                         const notification_port& port, std::uint64_t reference) {
     machine& host = current_machine();
-    const entry_ref provider = host.connection(connected.id());
+    const entry_ref provider = host.provider<lent_connection>(connected.id());
     const auto how = host.begin_call([&] {
         return "attach port to " + name_of(provider) + " notification " + std::to_string(type) +
                " reference " + std::to_string(reference);
@@ -76,19 +78,22 @@ return_code attach_port(const connection& connected, std::uint32_t type,
     if (!provider || !provider->present) return not_found;
     const auto queue = provider->unit->notification(type);
     if (!queue) return unsupported;
-    return host.attach(port.id(), queue) ? success : bad_argument;
+    auto* attached = host.lent<lent_port>(port.id());
+    if (attached == nullptr) return bad_argument;
+    attached->queue = queue;
+    return success;
 }
 
 notification_port allocate_port() {
     machine& host = current_machine();
     const auto how = host.begin_call([] { return std::string("allocate port"); });
-    return how ? notification_port() : notification_port(host.lend_port());
+    return how ? notification_port() : notification_port(host.lend(lent_port{}));
 }
 
 bool data_available(const mapped_memory& queue) {
     machine& host = current_machine();
     const auto how = host.begin_call([&] { return "data available " + name_of(host, queue.id()); });
-    const queue_mapping* mapping = host.mapping(queue.id());
+    const lent_mapping* mapping = host.lent<lent_mapping>(queue.id());
     if (how || check_mapping(mapping) != success) return false;
     mapping->queue->catch_up();
     return !mapping->queue->empty();
@@ -103,7 +108,7 @@ return_code dequeue(const mapped_memory& queue, byte_span& entry) {
         if (*how == failure::nothing) entry = {};
         return code_of(*how);
     }
-    const queue_mapping* mapping = host.mapping(queue.id());
+    const lent_mapping* mapping = host.lent<lent_mapping>(queue.id());
     const return_code usable = check_mapping(mapping);
     if (usable != success) return usable;
     if (mapping->queue->empty()) return simulated::nothing_queued;
@@ -119,11 +124,12 @@ return_code wait_for_data(const mapped_memory& queue, const notification_port& p
     machine& host = current_machine();
     const auto how = host.begin_call([&] { return "wait " + name_of(host, queue.id()); });
     if (how) return code_of(*how);
-    const queue_mapping* mapping = host.mapping(queue.id());
+    const lent_mapping* mapping = host.lent<lent_mapping>(queue.id());
     const return_code usable = check_mapping(mapping);
     if (usable != success) return usable;
-    if (host.attached_queue(port.id()) != mapping->queue) return bad_argument;
-    const queue_mapping kept = *mapping;  // an interrupt handler may change what is lent out
+    const auto* attached = host.lent<lent_port>(port.id());
+    if (attached == nullptr || attached->queue != mapping->queue) return bad_argument;
+    const lent_mapping kept = *mapping;  // an interrupt handler may change what is lent out
     return wait_on(host, kept);
 }
 

@@ -12,13 +12,14 @@ namespace platform {
 using simulated::current_machine;
 using simulated::entry_ref;
 using simulated::failure;
-using simulated::hid_object;
+using simulated::lent_hid_device;
+using simulated::lent_service;
 using simulated::machine;
 
 namespace {
 
 std::string name_of(machine& host, handle_id id) {
-    const hid_object* object = host.hid_device(id);
+    const lent_hid_device* object = host.lent<lent_hid_device>(id);
     return object != nullptr ? object->provider->name : "nothing";
 }
 
@@ -32,10 +33,10 @@ void hid_device_kind::release(handle_id id) {
 
 hid_device create_hid_device(const service& provider) {
     machine& host = current_machine();
-    const entry_ref entry = host.service(provider.id());
+    const entry_ref entry = host.provider<lent_service>(provider.id());
     const auto how = host.begin_call([&] { return "create hid device " + name_of(entry); });
     if (how || !entry || !entry->present || !entry->hid) return {};
-    return hid_device(host.lend_hid_device(entry));
+    return hid_device(host.lend(lent_hid_device{entry}));
 }
 
 return_code open(const hid_device& device) {
@@ -43,7 +44,7 @@ return_code open(const hid_device& device) {
     const auto how =
         host.begin_call([&] { return "open hid device " + name_of(host, device.id()); });
     if (how) return code_of(*how);
-    hid_object* object = host.hid_device(device.id());
+    lent_hid_device* object = host.lent<lent_hid_device>(device.id());
     if (object == nullptr || !object->provider->present) return not_found;
     object->is_open = true;
     return success;
@@ -59,7 +60,7 @@ return_code feature_report(const hid_device& device, std::uint8_t report_id, byt
         if (*how == failure::nothing) report = {};
         return code_of(*how);
     }
-    const hid_object* object = host.hid_device(device.id());
+    const lent_hid_device* object = host.lent<lent_hid_device>(device.id());
     if (object == nullptr || !object->provider->present) return not_found;
     if (!object->is_open) return bad_argument;
     const auto* bytes = object->provider->hid->feature_report(report_id);
@@ -74,7 +75,7 @@ return_code close(const hid_device& device) {
     machine& host = current_machine();
     const auto how =
         host.begin_call([&] { return "close hid device " + name_of(host, device.id()); });
-    hid_object* object = host.hid_device(device.id());
+    lent_hid_device* object = host.lent<lent_hid_device>(device.id());
     const bool was_open = object != nullptr && std::exchange(object->is_open, false);
     if (how) return code_of(*how);
     return was_open ? success : bad_argument;

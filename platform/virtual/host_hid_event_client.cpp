@@ -13,9 +13,16 @@ namespace platform {
 using simulated::current_machine;
 using simulated::entry_ref;
 using simulated::event_listener;
+using simulated::lent_hid_event_client;
+using simulated::lent_hid_services;
 using simulated::machine;
 
 namespace {
+
+std::shared_ptr<event_listener> listener_of(machine& host, handle_id id) {
+    const auto* lent = host.lent<lent_hid_event_client>(id);
+    return lent == nullptr ? nullptr : lent->listener;
+}
 
 // Sets one callback of a client.
 template <class Callback>
@@ -24,7 +31,7 @@ return_code set_callback(const hid_event_client& client, const char* call_name,
     machine& host = current_machine();
     const auto how = host.begin_call([&] { return std::string(call_name); });
     if (how) return code_of(*how);
-    const auto listener = host.hid_event_client(client.id());
+    const auto listener = listener_of(host, client.id());
     if (!listener) return not_found;
     *listener.*member = std::move(callback);
     return success;
@@ -48,8 +55,8 @@ void hid_event_client_kind::release(handle_id id) {
 void hid_service_list_kind::release(handle_id id) {
     machine& host = current_machine();
     host.note([&] {
-        const auto* list = host.hid_service_list(id);
-        return "release list of " + std::to_string(list == nullptr ? 0 : list->size()) +
+        const auto* list = host.lent<lent_hid_services>(id);
+        return "release list of " + std::to_string(list == nullptr ? 0 : list->services.size()) +
                " hid services";
     });
     host.take_back(id);
@@ -60,7 +67,7 @@ hid_event_client create_hid_event_client() {
     const auto how = host.begin_call([] { return std::string("create hid event client"); });
     if (how || !host.hid_events()) return {};
     return hid_event_client(
-        host.lend_hid_event_client(std::make_shared<event_listener>(host.hid_events()())));
+        host.lend(lent_hid_event_client{std::make_shared<event_listener>(host.hid_events()())}));
 }
 
 return_code set_event_callback(const hid_event_client& client,
@@ -84,7 +91,7 @@ return_code schedule_on_loop(const hid_event_client& client) {
     machine& host = current_machine();
     const auto how = host.begin_call([] { return std::string("schedule hid event client"); });
     if (how) return code_of(*how);
-    const auto listener = host.hid_event_client(client.id());
+    const auto listener = listener_of(host, client.id());
     if (!listener) return not_found;
     host.loop().schedule(client.id(), listener);
     return success;
@@ -93,8 +100,8 @@ return_code schedule_on_loop(const hid_event_client& client) {
 hid_service_list services_of(const hid_event_client& client) {
     machine& host = current_machine();
     const auto how = host.begin_call([] { return std::string("services of hid event client"); });
-    if (how || !host.hid_event_client(client.id())) return {};
-    return hid_service_list(host.lend_hid_service_list(hid_services(host)));
+    if (how || !listener_of(host, client.id())) return {};
+    return hid_service_list(host.lend(lent_hid_services{hid_services(host)}));
 }
 
 }  // namespace platform

@@ -12,6 +12,7 @@ namespace platform {
 using simulated::current_machine;
 using simulated::entry_ref;
 using simulated::failure;
+using simulated::lent_service;
 using simulated::machine;
 
 namespace {
@@ -29,7 +30,7 @@ const std::vector<entry_ref>& possible_matches(const machine& host, const dictio
 
 void service_kind::release(handle_id id) {
     machine& host = current_machine();
-    host.note([&] { return "release " + name_of(host.service(id)); });
+    host.note([&] { return "release " + name_of(host.provider<lent_service>(id)); });
     host.take_back(id);
 }
 
@@ -41,7 +42,7 @@ service first_match(const dictionary& matching) {
     const auto found = std::find_if(
         candidates.begin(), candidates.end(),
         [&](const entry_ref& candidate) { return simulated::matches(*candidate, matching); });
-    return found == candidates.end() ? service() : service(host.lend_service(*found));
+    return found == candidates.end() ? service() : service(host.lend(lent_service{*found}));
 }
 
 return_code all_matches(const dictionary& matching, std::vector<service>& found) {
@@ -52,25 +53,25 @@ return_code all_matches(const dictionary& matching, std::vector<service>& found)
     if (how) return success;
     for (const entry_ref& candidate : host.entries()) {
         if (simulated::matches(*candidate, matching))
-            found.emplace_back(host.lend_service(candidate));
+            found.emplace_back(host.lend(lent_service{candidate}));
     }
     return success;
 }
 
 service first_child(const service& parent, std::string_view plane) {
     machine& host = current_machine();
-    const entry_ref entry = host.service(parent.id());
+    const entry_ref entry = host.provider<lent_service>(parent.id());
     const auto how = host.begin_call([&] { return "first child of " + name_of(entry); });
     if (how) return {};
     if (!entry || !entry->present || plane != service_plane) return {};
     const auto child = std::find_if(entry->children.begin(), entry->children.end(),
                                     [](const entry_ref& one) { return one->present; });
-    return child == entry->children.end() ? service() : service(host.lend_service(*child));
+    return child == entry->children.end() ? service() : service(host.lend(lent_service{*child}));
 }
 
 return_code entry_name(const service& entry, std::string& name) {
     machine& host = current_machine();
-    const entry_ref named = host.service(entry.id());
+    const entry_ref named = host.provider<lent_service>(entry.id());
     const auto how = host.begin_call([&] { return "name of " + name_of(named); });
     if (how) {
         if (*how == failure::nothing) name.clear();
@@ -83,7 +84,7 @@ return_code entry_name(const service& entry, std::string& name) {
 
 bool read_property(const service& entry, std::string_view name, property& value) {
     machine& host = current_machine();
-    const entry_ref owner = host.service(entry.id());
+    const entry_ref owner = host.provider<lent_service>(entry.id());
     const auto how =
         host.begin_call([&] { return "property of " + name_of(owner) + " " + std::string(name); });
     if (how) return false;
@@ -101,7 +102,7 @@ std::optional<property> read_property(const service& entry, std::string_view nam
 
 return_code set_property(const service& entry, std::string_view name, const property& value) {
     machine& host = current_machine();
-    const entry_ref owner = host.service(entry.id());
+    const entry_ref owner = host.provider<lent_service>(entry.id());
     const auto how = host.begin_call([&] {
         return "set property of " + name_of(owner) + " " + std::string(name) + " = " +
                describe(value);

@@ -16,14 +16,14 @@ namespace platform::simulated {
 // A HID device interface: hands on the records of its device.
 class record_listener final : public loop_source {
 public:
-    explicit record_listener(std::shared_ptr<entry> device) : provider(std::move(device)) {}
+    explicit record_listener(entry_ref device) : provider(std::move(device)) {}
 
     [[nodiscard]] std::optional<machine_clock::time> next_due() const override {
         return provider->present ? provider->records->next_due() : std::nullopt;
     }
     void call_back() override;
 
-    const std::shared_ptr<entry> provider;
+    const entry_ref provider;
     std::function<void(byte_view)> on_record;
 };
 

@@ -3,10 +3,10 @@
 
 #include <functional>
 #include <map>
-#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "platform/clock.h"
@@ -17,29 +17,9 @@
 #include "platform/virtual/handle_table.h"
 #include "platform/virtual/hid_event_source.h"
 #include "platform/virtual/interrupts.h"
-#include "platform/virtual/listeners.h"
 #include "platform/virtual/machine_clock.h"
 
 namespace platform::simulated {
-
-using entry_ref = std::shared_ptr<entry>;
-
-// An entry in the words of the call log.
-inline std::string name_of(const entry_ref& one) {
-    return one ? one->name : "nothing";
-}
-
-// A HID device object that a client holds.
-struct hid_object {
-    entry_ref provider;
-    bool is_open = false;
-};
-
-// A data queue mapped by a client.
-struct queue_mapping {
-    entry_ref provider;
-    std::shared_ptr<shared_queue> queue;
-};
 
 // A platform call under way, and how it is to fail, if it is. Its end is a safe point: an interrupt
 // noted by then is served.
@@ -90,41 +70,29 @@ public:
 
     // --- what is lent out ---
 
-    handle_id lend_service(entry_ref provider);
-    handle_id lend_connection(entry_ref provider);
-    handle_id lend_hid_device(entry_ref provider);
-    handle_id lend_mapping(queue_mapping mapping);
-    handle_id lend_port();
-    handle_id lend_hid_plugin(entry_ref provider);
-    handle_id lend_hid_interface(std::shared_ptr<record_listener> listener);
-    handle_id lend_hid_event_client(std::shared_ptr<event_listener> listener);
-    handle_id lend_hid_service_list(std::vector<entry_ref> services);
+    // Lends an object out; its handle.
+    handle_id lend(handle_table::object lent) { return handles_.lend(std::move(lent)); }
 
-    // The entry behind a service, the provider of a connection or a HID plug-in, what else stands
-    // behind a handle; null if there is no such handle.
-    [[nodiscard]] entry_ref service(handle_id id) const;
-    [[nodiscard]] entry_ref connection(handle_id id) const;
-    [[nodiscard]] entry_ref hid_plugin(handle_id id) const;
-    [[nodiscard]] std::shared_ptr<record_listener> hid_interface(handle_id id) const;
-    [[nodiscard]] std::shared_ptr<event_listener> hid_event_client(handle_id id) const;
-    [[nodiscard]] const std::vector<entry_ref>* hid_service_list(handle_id id) const {
-        return hid_service_lists_.find(id);
+    // The object of a kind behind a handle, until the next change of what is lent out; null if
+    // there is none.
+    template <class Kind>
+    [[nodiscard]] Kind* lent(handle_id id) {
+        return handles_.find<Kind>(id);
     }
-    [[nodiscard]] hid_object* hid_device(handle_id id) { return hid_devices_.find(id); }
-    [[nodiscard]] const queue_mapping* mapping(handle_id id) const { return mappings_.find(id); }
 
-    // Lets a queue signal its data on a port; false if there is no such port.
-    bool attach(handle_id port, std::shared_ptr<shared_queue> queue);
+    // The entry of such an object; null if there is none.
+    template <class Kind>
+    [[nodiscard]] entry_ref provider(handle_id id) {
+        const Kind* object = lent<Kind>(id);
+        return object == nullptr ? nullptr : object->provider;
+    }
 
-    // The queue that signals its data on a port; null if none does.
-    [[nodiscard]] std::shared_ptr<shared_queue> attached_queue(handle_id port) const;
-
-    // Takes a handle back, of whichever kind.
+    // Takes a handle back, of whichever kind, and its object off the event loop.
     void take_back(handle_id id);
 
     // How many handles of all kinds are out, and HID devices still open, those included whose
     // object was released before it was closed.
-    [[nodiscard]] std::size_t open_handles() const;
+    [[nodiscard]] std::size_t open_handles() const { return handles_.still_open(); }
 
     machine_clock& clock() { return clock_; }
 
@@ -160,7 +128,6 @@ public:
 
 private:
     std::optional<failure> count_call();
-    handle_id next_handle();
 
     struct planned_failure {
         std::size_t call;
@@ -175,17 +142,7 @@ private:
     std::map<std::string, std::vector<entry_ref>, std::less<>> by_class_;
     std::optional<calendar_instant> boot_time_;
     hid_event_system hid_events_;
-    handle_table<entry_ref> services_;
-    handle_table<entry_ref> connections_;
-    handle_table<hid_object> hid_devices_;
-    std::size_t hid_devices_left_open_ = 0;
-    handle_table<queue_mapping> mappings_;
-    handle_table<std::shared_ptr<shared_queue>> ports_;  // null: nothing attached
-    handle_table<entry_ref> hid_plugins_;
-    handle_table<std::shared_ptr<record_listener>> hid_interfaces_;
-    handle_table<std::shared_ptr<event_listener>> hid_event_clients_;
-    handle_table<std::vector<entry_ref>> hid_service_lists_;
-    handle_id last_handle_ = 0;
+    handle_table handles_;
     machine_clock clock_;
     event_loop loop_;
     std::vector<std::string> log_;
