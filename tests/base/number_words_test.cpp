@@ -1,7 +1,9 @@
 // Numbers and payloads as users type them.
 #include <limits>
 #include <map>
+#include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include <gtest/gtest.h>
@@ -48,6 +50,41 @@ TEST(parse_number, ends_the_process_with_the_message_and_the_word) {
         EXPECT_EQ(refused.status, 1) << word;
         EXPECT_EQ(refused.out, "duration is invalid (" + word + ")\n");
         EXPECT_EQ(refused.err, "");
+    }
+}
+
+// Digit by digit, for runs that fit.
+std::optional<std::int64_t> slowly_read(std::string_view digits, int base) {
+    std::int64_t value = 0;
+    for (const char c : digits) {
+        const std::string_view known = "0123456789abcdef0123456789ABCDEF";
+        const auto found = known.find(c);
+        const auto digit = static_cast<std::int64_t>(found % 16);
+        if (found == std::string_view::npos || digit >= base) return std::nullopt;
+        value = value * base + digit;
+    }
+    return value;
+}
+
+TEST(read_digits, any_byte_at_any_place_of_a_run_of_any_length) {
+    for (const int base : {10, 16}) {
+        EXPECT_FALSE(nrx::read_digits("", base));
+        for (std::size_t length = 1; length <= 16; ++length) {
+            const auto whole =
+                std::string_view(base == 10 ? "1234567890123456" : "1a2Bc3D4e5F67890")
+                    .substr(16 - length);
+            for (std::size_t place = 0; place < length; ++place) {
+                for (int byte = 0; byte < 256; ++byte) {
+                    // In memory of its own size: nothing beyond may be read.
+                    std::vector<char> run(whole.begin(), whole.end());
+                    run[place] = static_cast<char>(byte);
+                    if (base == 16 && length == 16 && place == 0 && byte > '7') continue;
+                    const std::string_view digits(run.data(), run.size());
+                    ASSERT_EQ(nrx::read_digits(digits, base), slowly_read(digits, base))
+                        << base << ' ' << digits;
+                }
+            }
+        }
     }
 }
 
