@@ -2,6 +2,7 @@
 
 #include <cstdint>
 #include <cstdlib>
+#include <memory>
 #include <new>
 #include <sys/mman.h>
 
@@ -9,10 +10,11 @@ namespace nrx::event_memory {
 
 namespace {
 
+constexpr std::size_t huge_page_size = std::size_t{1} << 21;
+
 // A block is as large as a huge page and aligned to its size: an event finds its block by its own
-// address, and the system maps the block at once, where it can. Mapping a page at a time would take
-// a quarter of the time in which a file is read.
-constexpr std::size_t block_size = std::size_t{1} << 21;
+// address, and the system maps the block at once, where it can.
+constexpr std::size_t block_size = huge_page_size;
 
 struct block {
     std::size_t used = sizeof(block);
@@ -31,7 +33,7 @@ block* block_of(void* event) {
 block* make_block(bool is_first) {
     void* memory = std::aligned_alloc(block_size, block_size);
     if (memory == nullptr) throw std::bad_alloc();
-    if (!is_first) ::madvise(memory, block_size, MADV_HUGEPAGE);
+    if (!is_first) prefer_huge_pages(memory, block_size);
     return new (memory) block;
 }
 
@@ -57,6 +59,12 @@ void give_back(void* event) noexcept {
     } else {
         std::free(from);
     }
+}
+
+void prefer_huge_pages(void* memory, std::size_t size) noexcept {
+    void* first = memory;
+    if (std::align(huge_page_size, huge_page_size, first, size) == nullptr) return;
+    ::madvise(first, size / huge_page_size * huge_page_size, MADV_HUGEPAGE);
 }
 
 }  // namespace nrx::event_memory

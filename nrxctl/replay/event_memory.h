@@ -11,4 +11,8 @@ namespace nrx::event_memory {
 void* take(std::size_t size);
 void give_back(void* event) noexcept;
 
+// Asks the system to map the whole huge pages in a piece of memory each at once, as they come to be
+// used. Mapping a page of four kilobytes at a time takes longer than filling it.
+void prefer_huge_pages(void* memory, std::size_t size) noexcept;
+
 }  // namespace nrx::event_memory

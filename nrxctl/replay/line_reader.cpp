@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <sys/stat.h>
 
 namespace nrx {
 
@@ -19,6 +20,12 @@ line_reader::line_reader(const std::string& path)
 
 bool line_reader::good() const {
     return file_ && std::ferror(file_.get()) == 0;
+}
+
+std::size_t line_reader::file_size() const {
+    struct stat status {};
+    if (!file_ || ::fstat(::fileno(file_.get()), &status) != 0) return 0;
+    return static_cast<std::size_t>(status.st_size);
 }
 
 std::optional<std::string_view> line_reader::next() {

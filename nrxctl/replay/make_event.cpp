@@ -17,7 +17,7 @@ event_ptr make() {
 
 struct event_class {
     std::string_view tag;
-    event_ptr (*make)();
+    event_maker make;
 };
 
 constexpr std::array event_classes{
@@ -29,10 +29,15 @@ constexpr std::array event_classes{
 
 }  // namespace
 
-event_ptr make_event(std::string_view tag) {
+event_maker find_event_maker(std::string_view tag) {
     const auto* row = std::find_if(event_classes.begin(), event_classes.end(),
                                    [&](const event_class& known) { return known.tag == tag; });
-    return row == event_classes.end() ? nullptr : row->make();
+    return row == event_classes.end() ? nullptr : row->make;
+}
+
+event_ptr make_event(std::string_view tag) {
+    const event_maker make = find_event_maker(tag);
+    return make == nullptr ? nullptr : make();
 }
 
 }  // namespace nrx

@@ -1,7 +1,5 @@
 #include "nrxctl/replay/sample_values.h"
 
-#include <optional>
-
 namespace nrx {
 
 namespace {
@@ -10,11 +8,13 @@ std::optional<sample_key> named(std::string_view word, std::string_view name, sa
     return word == name ? std::optional(key) : std::nullopt;
 }
 
+}  // namespace
+
 // By the length first: no two longer names are equally long.
-std::optional<sample_key> find_key(std::string_view word) {
-    switch (word.size()) {
+std::optional<sample_key> find_sample_key(std::string_view name) {
+    switch (name.size()) {
         case 1:
-            switch (word.front()) {
+            switch (name.front()) {
                 case 'x':
                     return sample_key::x;
                 case 'y':
@@ -27,22 +27,20 @@ std::optional<sample_key> find_key(std::string_view word) {
                     return std::nullopt;
             }
         case 5:
-            return named(word, "shake", sample_key::shake);
+            return named(name, "shake", sample_key::shake);
         case 8:
-            return named(word, "sampleid", sample_key::sampleid);
+            return named(name, "sampleid", sample_key::sampleid);
         case 9:
-            return named(word, "timestamp", sample_key::timestamp);
+            return named(name, "timestamp", sample_key::timestamp);
         case 11:
-            return named(word, "temperature", sample_key::temperature);
+            return named(name, "temperature", sample_key::temperature);
         default:
             return std::nullopt;
     }
 }
 
-}  // namespace
-
 void sample_values::set(std::string_view key, std::string_view value) {
-    if (const auto known = find_key(key)) values_[static_cast<std::size_t>(*known)] = value;
+    if (const auto known = find_sample_key(key)) set(*known, value);
 }
 
 }  // namespace nrx
