@@ -1,6 +1,5 @@
 #include "nrxctl/replay/line_reader.h"
 
-#include <algorithm>
 #include <cstring>
 #include <sys/stat.h>
 
@@ -40,7 +39,8 @@ std::optional<std::string_view> line_reader::next() {
         }
         scanned_ = end_;
     } while (read_more());
-    if (begin_ == end_) return std::nullopt;
+    // What stands before a place that cannot be read is no line.
+    if (begin_ == end_ || !good()) return std::nullopt;
     return take_until(end_);
 }
 
@@ -53,7 +53,7 @@ std::string_view line_reader::take_until(std::size_t line_end) {
 // Makes room behind what is left, moved to the front, and fills it.
 bool line_reader::read_more() {
     if (!good()) return false;
-    std::copy(buffer_.data() + begin_, buffer_.data() + end_, buffer_.data());
+    std::memmove(buffer_.data(), buffer_.data() + begin_, end_ - begin_);
     end_ -= begin_;
     scanned_ -= begin_;
     begin_ = 0;

@@ -1,6 +1,7 @@
 // The SPI status records of the HID devices: what goes over the bus to a sensor, what comes back,
 // and how the transfers went.
 
+#include <algorithm>
 #include <array>
 #include <chrono>
 #include <memory>
@@ -60,10 +61,10 @@ public:
     std::vector<std::uint8_t> take_record() override {
         const record_row& row = record_rows[row_];
         const auto time = std::chrono::duration_cast<std::chrono::microseconds>(next_);
-        std::vector<std::uint8_t> record(header_size);
+        std::vector<std::uint8_t> record(header_size + row.bytes.size());
         put_le(record, 0, sizeof(std::uint64_t), static_cast<std::uint64_t>(time.count()));
         record[header_size - 1] = row.type;
-        record.insert(record.end(), row.bytes.begin(), row.bytes.end());
+        std::copy(row.bytes.begin(), row.bytes.end(), record.begin() + header_size);
         row_ = (row_ + 1) % record_rows.size();
         next_ += interval;
         return record;
