@@ -19,21 +19,23 @@ bool may_try_again(int descriptor) {
     return ::poll(&waiting, 1, -1) > 0 || errno == EINTR;
 }
 
-void write_all(int descriptor, std::string_view text) {
+// Whether all was written.
+bool write_all(int descriptor, std::string_view text) {
     while (!text.empty()) {
         const ssize_t written = ::write(descriptor, text.data(), text.size());
         if (written > 0) {
             text.remove_prefix(static_cast<std::size_t>(written));
         } else if (written == 0 || !may_try_again(descriptor)) {
-            return;
+            return false;
         }
     }
+    return true;
 }
 
 }  // namespace
 
-void write_output(std::string_view text) {
-    write_all(STDOUT_FILENO, text);
+bool write_output(std::string_view text) {
+    return write_all(STDOUT_FILENO, text);
 }
 
 void print_line(std::string_view text) {

@@ -71,7 +71,7 @@ void generate_samples(const signal_request& request) {
     }
     for (std::uint32_t i = 0; i < request.samples; ++i) {
         std::string line = event->generate(request.signal_type, request.interval, request.samples);
-        write_output(line.append("\n"));
+        if (!write_output(line.append("\n"))) return;
     }
 }
 

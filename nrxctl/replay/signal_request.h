@@ -26,7 +26,8 @@ struct signal_request {
 std::optional<signal_request> read_signal_request(argument_words& words);
 
 // Writes the samples that are asked for on standard output, a line each; or a line that says that
-// there is no such service, or no such signal for it.
+// there is no such service, or no such signal for it. Ends with the first line that cannot be
+// written: there may be four billion of them.
 void generate_samples(const signal_request& request);
 
 }  // namespace nrx

@@ -39,7 +39,7 @@ public:
     // The tag of the event's lines, which is the name of its service.
     [[nodiscard]] virtual std::string name() const = 0;
 
-    // Microseconds; one beyond signed 32 bits is held widened with its sign.
+    // Microseconds: a signed 32-bit number, widened with its sign.
     [[nodiscard]] virtual std::uint64_t timestamp() const = 0;
 
     // Stores the delta in the record; it is 0 at first.
