@@ -6,7 +6,6 @@
 #include "nrxctl/base/tick_period.h"
 #include "nrxctl/profiler/profile_command.h"
 #include "platform/clock.h"
-#include "tests/support/report_bytes.h"
 #include "tests/support/word_vector.h"
 
 namespace tests {
@@ -44,10 +43,6 @@ byte_list joined(const std::vector<byte_list>& lists) {
     for (const byte_list& one : lists)
         all.insert(all.end(), one.begin(), one.end());
     return all;
-}
-
-byte_list words_of(std::initializer_list<std::uint64_t> words) {
-    return report_with(4 * words.size(), {{0, 4, words}});
 }
 
 void profiler_test::SetUp() {

@@ -9,6 +9,7 @@
 
 #include "nrxctl/base/profile_record.h"
 #include "tests/support/device_test.h"
+#include "tests/support/report_bytes.h"
 
 namespace tests {
 
@@ -47,9 +48,6 @@ std::string dumped(std::uint8_t type, std::uint8_t mark);
 
 // Several byte lists, one after the other.
 byte_list joined(const std::vector<byte_list>& lists);
-
-// Little-endian 32-bit words.
-byte_list words_of(std::initializer_list<std::uint64_t> words);
 
 // Whether an interrupt would end the process.
 bool has_default_action();

@@ -8,13 +8,6 @@ namespace tests {
 
 namespace {
 
-const sample_text_file& samples() {
-    static const sample_text_file file(
-        "accel,sampleid=1,temperature=0,x=0,y=0,z=0,timestamp=0\n"
-        "pressure,sampleid=1,temperature=0,p=0,timestamp=0\n");
-    return file;
-}
-
 // A host on which nothing is loaded yet, and one on which everything is.
 std::unique_ptr<machine> make_host() {
     auto host = std::make_unique<machine>();
@@ -25,11 +18,9 @@ std::unique_ptr<machine> make_host() {
 // Loaded past the host, whose platform calls count.
 std::unique_ptr<machine> make_loaded_host() {
     auto host = make_host();
-    for (const byte_list& head :
-         {byte_list{0x10, 0, 0, 0, 1, 0, 0, 0, 1, 0, 0, 0, 0, 0, 0, 0, 28, 0, 0, 0, 28},
-          byte_list{0x13, 0, 0, 0, 1, 0, 0, 0, 1, 0, 0, 0, 0, 0, 0, 0, 20, 0, 0, 0, 20}}) {
-        byte_list request = head;
-        request.resize(20U + head.back());
+    for (byte_list request :
+         {words_of({0x10, 1, 1, 0, 28, 28}), words_of({0x13, 1, 1, 0, 20, 20})}) {
+        request.resize(20U + request[20]);
         platform::call_outputs nothing;
         const auto kr = host->find("client")->unit->call(0, {{}, request}, nothing);
         EXPECT_EQ(kr, platform::success);
@@ -49,18 +40,20 @@ bool is_told_somehow(const fault& one) {
 }  // namespace
 
 TEST(replay_fault_sweep, subcommands_tell_of_every_failure_and_leave_nothing_open) {
+    const sample_text_file samples(
+        "accel,sampleid=1,temperature=0,x=0,y=0,z=0,timestamp=0\n"
+        "pressure,sampleid=1,temperature=0,p=0,timestamp=0\n");
     sweep_faults(
         make_host,
-        [] {
-            run_replay({"load", samples().path()});
+        [&] {
+            run_replay({"load", samples.path()});
         },
         is_told_somehow);
-    for (const std::vector<std::string>& words :
-         std::vector<std::vector<std::string>>{{"unload", "accel", "pressure"},
-                                               {"enable", "accel", "19"},
-                                               {"disable", "accel"},
-                                               {"schedule-enable", "1", "accel"},
-                                               {"get-status"}}) {
+    for (const lines& words : std::vector<lines>{{"unload", "accel", "pressure"},
+                                                 {"enable", "accel", "19"},
+                                                 {"disable", "accel"},
+                                                 {"schedule-enable", "1", "accel"},
+                                                 {"get-status"}}) {
         sweep_faults(
             make_loaded_host, [&] { run_replay(words); }, is_told_somehow);
     }

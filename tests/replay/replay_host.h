@@ -6,8 +6,11 @@
 #include <vector>
 
 #include "tests/support/device_test.h"
+#include "tests/support/report_bytes.h"
 
 namespace tests {
+
+using lines = std::vector<std::string>;
 
 // A file for as long as this object lives.
 class sample_text_file {
@@ -23,23 +26,31 @@ private:
     std::string path_;
 };
 
-// Registers accel (id 0x10), gyro (0x11), compass (0x12), pressure (0x13) and NRXApp (0x51) with
-// its client; the driver of NRXApp's reports. No service has samples.
+// Registers accel (id 0x10), gyro (0x11), compass (0x04030201), pressure (0x13) and NRXApp (0x51)
+// with its client; the driver of NRXApp's reports. No service has samples.
 interface_driver& put_replay_services(machine& host);
 
 // Runs a subcommand as the command line gives it; how many further words it took.
-int run_replay(std::vector<std::string> words);
+int run_replay(lines words);
 
 // The same, with what it wrote; how many further words it took, if asked.
-outcome replay(const std::vector<std::string>& words, int* taken = nullptr);
+outcome replay(const lines& words, int* taken = nullptr);
 
 class replay_test : public device_test {
 protected:
     void SetUp() override;
 
+    // Loads a file with this text, and further words behind it; taken is then how many of all words
+    // it took.
+    outcome load(std::string_view text, lines further = {});
+    int taken = 0;
+
+    // Lets the application answer with these states, and take any.
+    void answer_with(const byte_list& report);
+
     // The method calls since the last time, in the words of the log, without what they all end
     // with.
-    std::vector<std::string> calls();
+    lines calls();
 
     interface_driver* app = nullptr;
 
@@ -47,7 +58,12 @@ private:
     std::size_t seen_ = 0;
 };
 
-// A failure report of the library, from a file of its folder.
+// Failure reports of the library, from a file of its folder.
 std::string failed(std::string_view file, std::string_view condition, std::string_view code = "");
+inline const std::string no_such_service =
+    failed("base/service_discovery.cpp", "service != ((io_object_t) 0)");
+
+// Reading the states, in the words of the log.
+inline constexpr const char* read_state = "call NRXApp 2 scalars [0x47] in [] results 0 room 384";
 
 }  // namespace tests

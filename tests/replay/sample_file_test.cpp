@@ -73,8 +73,10 @@ TEST(sample_file, reads_what_the_grammar_allows) {
              {accel("shake=01"), accel_event},
              {accel("shake=1,shake=2"), accel_event},
              {accel("p=junk"), accel_event},
-             {"pressure,p=-1,timestamp=3,temperature=100,sampleid=8,shake=1,x=junk",
-              "pressure 20 0 8 65536 -1 @3\n"},
+             // Values of a line are none of the next one's: neither the shake nor the numbers.
+             {"pressure,p=-1,timestamp=3,temperature=100,sampleid=8,shake=1,x=junk\n" +
+                  accel("k=v"),
+              "accel 28 2 1 0 2 3 4 @5\npressure 20 0 8 65536 -1 @3\n"},
              {"# a comment\n#\n#accel,x=1\n,k=v\n,\n two words\naccel too,k=v\n" + accel("k=v"),
               accel_event},
          }) {
@@ -135,6 +137,11 @@ TEST(sample_file, a_value_that_is_missing_or_no_number_ends_the_process) {
               "error converting samples (e)"},
              {"accel,sampleid=1,temperature=1,x=1,y=1,z=1,shake=1,timestamp=f",
               "error converting timestamp (f)"},
+             {"accel,sampleid=1,x=1,y=1,z=1,timestamp=1", "error converting samples ()"},
+             {"accel,sampleid=1,temperature=1,y=1,z=1,timestamp=1", "error converting samples ()"},
+             {"accel,sampleid=1,temperature=1,x=1,z=1,timestamp=1", "error converting samples ()"},
+             {"accel,sampleid=1,temperature=1,x=1,y=1,timestamp=1", "error converting samples ()"},
+             {"pressure,sampleid=1,temperature=1,timestamp=1", "error converting samples ()"},
              {"gyro,sampleid=1,temperature=1,x=1,y=1,z=1", "error converting timestamp ()"},
              {accel("shake=1"), "Shake samples are not allowed"},
              {accel("shake=0,shake=1"), "Shake samples are not allowed"},
@@ -147,7 +154,7 @@ TEST(sample_file, a_value_that_is_missing_or_no_number_ends_the_process) {
              {"pressure,sampleid=1,p=h,temperature=1,timestamp=j", "error converting samples (h)"},
              {"pressure,sampleid=1,p=1,temperature=1", "error converting timestamp ()"},
          }) {
-        const auto result = read(line + "\nnobody\n");
+        const auto result = read(accel("p=1,shake=0\n") + line + "\nnobody\n");
         EXPECT_EQ(result.written.out, message + "\n") << line;
         EXPECT_EQ(result.written.status, 1) << line;
         EXPECT_EQ(result.written.err, "") << line;
@@ -216,13 +223,13 @@ TEST(sample_file, negative_times_come_after_all_others_and_equal_times_keep_thei
               "gyro 28 0 3 0 0 0 0 @10\n"
               "gyro 28 2147483638 2 0 0 0 0 @18446744071562067968\n"
               "gyro 28 2147483643 1 0 0 0 0 @18446744073709551611\n");
-    std::string lines = at("accel", "100", "9");
+    std::string text = at("accel", "100", "9");
     std::string expected;
     for (int i = 0; i < 40; ++i) {
-        lines += at("accel", std::to_string(i), "8");
+        text += at("accel", std::to_string(i), "8");
         expected += "accel 28 0 " + std::to_string(i) + " 0 0 0 0 @8\n";
     }
-    EXPECT_EQ(read(lines).events, expected + "accel 28 1 100 0 0 0 0 @9\n");
+    EXPECT_EQ(read(text).events, expected + "accel 28 1 100 0 0 0 0 @9\n");
 }
 
 TEST(sample_file, lines_are_read_whole_wherever_they_fall_in_the_file) {

@@ -4,8 +4,6 @@
 
 namespace tests {
 
-using lines = std::vector<std::string>;
-
 namespace {
 
 const std::string usage =
@@ -21,35 +19,9 @@ const std::string usage =
     "<num_samples|frequency_hz>\n"
     "    nrxctl --replay help\n";
 
-const std::string no_word = failed("replay/state_subcommands.cpp", "argc > optind");
-const std::string no_such_service =
-    failed("base/service_discovery.cpp", "service != ((io_object_t) 0)");
-
-// What is sent for the services accel and pressure.
-std::string state_call(const std::string& delay, const std::string& state) {
-    return "call NRXApp 1 scalars [0x47] in [10 00 00 00 " + delay + " " + state +
-           " 00 00 00 13 00 00 00 " + delay + " " + state + " 00 00 00]";
-}
-
 }  // namespace
 
-class replay_states : public replay_test {
-protected:
-    // Lets the application answer with these bytes, and take any.
-    void answer_with(const byte_list& report) {
-        app->set_report_source(0x47, [report](std::size_t, byte_list& reply) {
-            reply = report;
-            return platform::success;
-        });
-        app->set_report_sink(0x47, [](platform::byte_view) { return platform::success; });
-    }
-
-    std::vector<nrx::replay_state_entry> status() {
-        std::vector<nrx::replay_state_entry> entries;
-        capture([&] { entries = nrx::replay_status(); });
-        return entries;
-    }
-};
+using replay_states = replay_test;
 
 TEST_F(replay_states, usage_is_the_answer_to_help_and_to_unknown_words) {
     EXPECT_EQ(replay({"help", "ignored"}).out, usage);
@@ -62,31 +34,28 @@ TEST_F(replay_states, usage_is_the_answer_to_help_and_to_unknown_words) {
 }
 
 TEST_F(replay_states, whole_entries_alone_are_read) {
-    byte_list report{0x10, 0, 0, 0, 4, 3, 2, 1, 2, 0, 0, 0, 0xff, 0xff, 0xff, 0xff};
-    for (const std::size_t size : {0U, 1U, 11U}) {
-        answer_with({report.begin(), report.begin() + static_cast<std::ptrdiff_t>(size)});
-        EXPECT_TRUE(status().empty()) << size;
+    const auto status = [&](std::size_t size) {
+        byte_list report = words_of({0x10, 0x01020304, 2, 0xffffffff});
+        report.resize(size);
+        answer_with(report);
+        std::vector<nrx::replay_state_entry> read;
+        capture([&] { read = nrx::replay_status(); });
+        return read;
+    };
+    for (const auto& [size, count] : std::vector<std::pair<std::size_t, std::size_t>>{
+             {0, 0}, {1, 0}, {11, 0}, {12, 1}, {16, 1}, {384, 32}, {385, 0}}) {
+        EXPECT_EQ(status(size).size(), count) << size;
     }
-    answer_with(report);
-    const auto entries = status();
-    ASSERT_EQ(entries.size(), 1U);
-    EXPECT_EQ(entries[0].service_id, 0x10U);
-    EXPECT_EQ(entries[0].delay, 0x01020304U);
-    EXPECT_EQ(entries[0].state, 2U);
-    report.resize(384);
-    answer_with(report);
-    EXPECT_EQ(status().size(), 32U);
-    report.resize(385);
-    answer_with(report);
-    EXPECT_TRUE(status().empty());
+    const auto first = status(16).at(0);
+    EXPECT_EQ(first.service_id, 0x10U);
+    EXPECT_EQ(first.delay, 0x01020304U);
+    EXPECT_EQ(first.state, 2U);
 }
 
 TEST_F(replay_states, are_listed_with_names_where_there_are_any) {
-    answer_with({0x13, 0, 0, 0,    9,    9,    9,    9, 0, 0,    0, 0,    0x77, 0,    0,
-                 0,    0, 0, 0,    0,    1,    0,    0, 0, 0x10, 0, 0,    0,    0,    0,
-                 0,    0, 2, 0,    0,    0,    0x11, 0, 0, 0,    0, 0,    0,    0,    3,
-                 0,    0, 0, 0xff, 0xff, 0xff, 0xff, 0, 0, 0,    0, 0xff, 0xff, 0xff, 0xff});
-    put_service(host, "a long service name", 0x11 + 1000);
+    answer_with(words_of({0x13, 0x09090909, 0, 0x77, 0, 1, 0x10, 0, 2, 0x11, 0, 3, 0x3f9, 0, 0,
+                          0xffffffff, 0, 0xffffffff}));
+    put_service(host, "a long service name", 0x3f9);
     const auto result = replay({"get-status"});
     EXPECT_EQ(result.out,
               "Replay status:\n"
@@ -94,9 +63,10 @@ TEST_F(replay_states, are_listed_with_names_where_there_are_any) {
               "Service 119        is loaded\n"
               "Service accel      is enabled\n"
               "Service gyro       is 3\n"
+              "Service a long service name is inactive\n"
               "Service 4294967295 is 4294967295\n");
     EXPECT_EQ(result.err, no_such_service + no_such_service);
-    EXPECT_EQ(calls().size(), 2U);
+    EXPECT_EQ(calls(), lines(2, read_state));
 }
 
 TEST_F(replay_states, every_subcommand_that_needs_replay_says_that_it_is_not_enabled) {
@@ -111,7 +81,7 @@ TEST_F(replay_states, every_subcommand_that_needs_replay_says_that_it_is_not_ena
         const auto result = replay(words);
         EXPECT_EQ(result.out, "Replay is not enabled\n") << words[0];
         EXPECT_EQ(result.err, "") << words[0];
-        EXPECT_EQ(calls().size(), 1U) << words[0];
+        EXPECT_EQ(calls(), lines{read_state}) << words[0];
     }
     host.remove("NRXApp");
     const auto missing = replay({"get-status"});
@@ -133,10 +103,11 @@ TEST_F(replay_states, are_set_for_all_services_in_the_order_of_the_words) {
              {{"schedule-enable", "-2"}, "fe ff ff ff", "02"},
          }) {
         lines all = words;
-        all.insert(all.end(), {"accel", "19"});
-        int taken = 0;
+        all.insert(all.end(), {"compass", "19"});
         const auto result = replay(all, &taken);
-        EXPECT_EQ(calls().back(), state_call(delay, state)) << words[0];
+        EXPECT_EQ(calls().back(), "call NRXApp 1 scalars [0x47] in [01 02 03 04 " + delay + " " +
+                                      state + " 00 00 00 13 00 00 00 " + delay + " " + state +
+                                      " 00 00 00]");
         EXPECT_EQ(result.out + result.err, "") << words[0];
         EXPECT_EQ(taken, static_cast<int>(all.size()) - 1);
     }
@@ -145,15 +116,14 @@ TEST_F(replay_states, are_set_for_all_services_in_the_order_of_the_words) {
 TEST_F(replay_states, words_that_are_missing_or_belong_to_no_service_send_nothing) {
     for (const lines& words :
          std::vector<lines>{{"enable"}, {"disable"}, {"schedule-enable"}, {"schedule-enable", "1"}})
-        EXPECT_EQ(replay(words).err, no_word) << words[0];
+        EXPECT_EQ(replay(words).err, failed("replay/state_subcommands.cpp", "argc > optind"));
     const auto malformed = replay({"schedule-enable", "1s"});
     EXPECT_EQ(malformed.out, "invalid delay (1s)\n");
     EXPECT_EQ(malformed.status, 1);
     const auto unknown = replay({"enable", "accel", "nobody", "nobody"});
     EXPECT_EQ(unknown.err, no_such_service + failed("replay/replay_state.cpp", "success"));
     EXPECT_EQ(unknown.out, "");
-    for (const std::string& call : calls())
-        EXPECT_TRUE(call.starts_with("call NRXApp 2 ")) << call;
+    EXPECT_EQ(calls(), lines(6, read_state));
 }
 
 TEST_F(replay_states, what_the_application_refuses_is_reported_twice) {
@@ -161,25 +131,6 @@ TEST_F(replay_states, what_the_application_refuses_is_reported_twice) {
     EXPECT_EQ(replay({"enable", "accel"}).err,
               failed("base/command_channel.cpp", "kr == 0 ", code) +
                   failed("replay/replay_state.cpp", "kr == 0 ", code));
-}
-
-TEST_F(replay_states, follow_what_is_loaded_enabled_and_unloaded) {
-    const sample_text_file file("accel,sampleid=1,temperature=0,x=0,y=0,z=0,timestamp=0\n");
-    const auto state = [&] {
-        const std::string text = replay({"get-status"}).out;
-        const auto at = text.find("Service accel      is ");
-        return text.substr(at + 22, text.find('\n', at) - at - 22);
-    };
-    EXPECT_EQ(state(), "inactive");
-    replay({"load", file.path()});
-    EXPECT_EQ(state(), "loaded");
-    replay({"schedule-enable", "5", "accel"});
-    EXPECT_EQ(state(), "enabled");
-    EXPECT_EQ(status().front().delay, 5U);
-    replay({"disable", "0x10"});
-    EXPECT_EQ(state(), "loaded");
-    replay({"unload", "accel"});
-    EXPECT_EQ(state(), "inactive");
 }
 
 }  // namespace tests

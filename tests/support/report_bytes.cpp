@@ -20,6 +20,10 @@ std::vector<std::uint8_t> report_with(std::size_t size, std::initializer_list<nu
     return report;
 }
 
+std::vector<std::uint8_t> words_of(std::initializer_list<std::uint64_t> words) {
+    return report_with(4 * words.size(), {{0, 4, words}});
+}
+
 outcome printed(nrx::report_printer print, std::string_view service_name, std::int32_t report_id,
                 const std::vector<std::uint8_t>& report) {
     return capture([&] { print(service_name, report_id, report); });

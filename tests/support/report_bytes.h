@@ -31,6 +31,9 @@ struct number_at {
 std::vector<std::uint8_t> report_with(std::size_t size, std::initializer_list<number_at> numbers,
                                       std::uint8_t filler = 0xa5);
 
+// Little-endian 32-bit words.
+std::vector<std::uint8_t> words_of(std::initializer_list<std::uint64_t> words);
+
 // What a report printer prints.
 outcome printed(nrx::report_printer print, std::string_view service_name, std::int32_t report_id,
                 const std::vector<std::uint8_t>& report);
