@@ -40,12 +40,13 @@ TEST(parse_number, reads_decimal_and_prefixed_hexadecimal) {
 }
 
 TEST(parse_number, ends_the_process_with_the_message_and_the_word) {
-    for (const std::string& word : between_commas(
-             ",12a,a,-,+,--5,+-5,- 5, 5,5 ,1.5,0x,-0x,0X1f,0x1g,0x-1,0x "
-             "1,x1,5:,5/,0x5G,0x5@,0x5`,12345678901234g,"
-             "12345678901234567a,\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff,"
-             "9223372036854775808,"
-             "-9223372036854775808,0x8000000000000000,0x10000000000000000")) {
+    for (const std::string& word :
+         split(",12a,a,-,+,--5,+-5,- 5, 5,5 ,1.5,0x,-0x,0X1f,0x1g,0x-1,0x "
+               "1,x1,5:,5/,0x5G,0x5@,0x5`,12345678901234g,"
+               "12345678901234567a,\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff,"
+               "9223372036854775808,"
+               "-9223372036854775808,0x8000000000000000,0x10000000000000000",
+               ',')) {
         const auto refused = capture([&] { nrx::parse_number(word, "duration is invalid"); });
         EXPECT_EQ(refused.status, 1) << word;
         EXPECT_EQ(refused.out, "duration is invalid (" + word + ")\n");

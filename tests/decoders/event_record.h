@@ -7,6 +7,7 @@
 
 #include "nrxctl/base/profile_record.h"
 #include "tests/support/report_bytes.h"
+#include "tests/support/rows.h"
 
 namespace tests {
 

@@ -18,7 +18,7 @@ TEST_F(record_body, of_each_type_has_its_fields_in_order) {
     const auto function = record_of({0, 4, 0, 9}, {{16, 4, {1, 2, 3, 4}}}, 'f');
     const std::string function_numbers =
         ", 'arg':         4, 'task':         1, 'thread':         2, 'duration':         3,";
-    const std::vector<std::pair<nrx::profile_record, std::string>> rows{
+    const rows<nrx::profile_record, std::string> cases{
         {record_of({0, 3, 2, 2}, {{16, 2, 7}, {18, 8, 0x0807060504030201}}),
          " 'subtype':         7, 'packet-size':        30, 'data-length':        30, "
          "'data-offset':         0, "
@@ -53,7 +53,7 @@ TEST_F(record_body, of_each_type_has_its_fields_in_order) {
         {record_of({10, 0, 2, 3}, {{16, 4, {17, 0x3456789a, 0x12}}}),
          " 'wake_reason':        17, 'service_id': 878082202,"},
     };
-    for (const auto& [record, text] : rows)
+    for (const auto& [record, text] : cases)
         EXPECT_EQ(decoded_body(record), text);
 }
 

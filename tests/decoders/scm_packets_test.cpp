@@ -92,15 +92,6 @@ TEST_F(scm_packets, what_is_no_transfer_prints_nothing_and_changes_nothing) {
     EXPECT_EQ(print(data(1, 4)), "i2cm0.1:   data[24-0/100]: a5 \n");
 }
 
-TEST(scm_packet_printer, is_one_for_the_whole_process) {
-    EXPECT_EQ(capture([] {
-                  nrx::print_scm_packet(transfer(5, 3, 0, 77));
-                  nrx::print_scm_packet(data(1, 77));
-              }).out,
-              "i2c_ctrl1.3: scm_read wqr_timestamp=77 scm_timestamp=78187493530\n"
-              "i2c_ctrl1.3:   data[24-0/100]: a5 \n");
-}
-
 std::string dumped(std::string_view label, const std::vector<std::uint8_t>& bytes, int spaced) {
     return capture([&] { nrx::nrx_profile_hexdump(label, bytes, spaced); }).out;
 }
@@ -111,13 +102,6 @@ TEST(profile_hexdump, puts_a_blank_behind_each_byte_only_if_spaced_is_1) {
     EXPECT_EQ(dumped("x: ", {0x12}, 2), "x: 12\n");
     EXPECT_EQ(dumped("x: ", {0x12}, -1), "x: 12\n");
     EXPECT_EQ(dumped("", {}, 1), "\n");
-}
-
-TEST(profile_hexdump, of_a_record_has_96_digits) {
-    EXPECT_EQ(capture([] {
-                  nrx::dump_profile_record(record_of({0, 0, 0, 0}));
-              }).out,
-              "prof-event 000000002a000000bb1f000000000000" + std::string(64, '0') + "\n");
 }
 
 TEST(profile_hexdump, stops_the_process_if_the_line_would_not_fit) {

@@ -6,13 +6,14 @@
 #include <cstdio>
 #include <ctime>
 #include <fstream>
-#include <sstream>
 #include <thread>
 #include <unistd.h>
 
 #include <gtest/gtest.h>
 
+#include "tests/support/rows.h"
 #include "tests/support/running_program.h"
+#include "tests/support/word_vector.h"
 
 namespace {
 
@@ -21,21 +22,13 @@ using namespace std::chrono_literals;
 
 const std::string program = NRXCTL_PROGRAM;
 
-std::vector<std::string> split(const std::string& text, char separator) {
-    std::vector<std::string> pieces;
-    std::istringstream from(text);
-    for (std::string piece; std::getline(from, piece, separator);)
-        pieces.push_back(piece);
-    return pieces;
-}
-
 // Runs the program with words that have a blank between them.
 program_result run(const std::string& words, output_to target = output_to::pipe) {
-    return run_program(program, split(words, ' '), target);
+    return run_program(program, split(words), target);
 }
 
 TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
-    const std::vector<std::pair<std::string, std::string>> rows{
+    const rows<std::string, std::string> cases{
         {"", "an option is needed"},
         {"--foo", "unknown option --foo"},
         {"-x", "unknown option -x"},
@@ -56,7 +49,7 @@ TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
         {"--spi-status accel", "a word is missing after --spi-status"},
         {"--help=x", "unknown option --help=x"},
     };
-    for (const auto& [arguments, problem] : rows) {
+    for (const auto& [arguments, problem] : cases) {
         const auto result = run(arguments);
         EXPECT_EQ(result.status, 2) << problem;
         EXPECT_EQ(result.err, "nrxctl: " + problem + "\nTry nrxctl --help.\n");
@@ -64,7 +57,7 @@ TEST(nrxctl_program, misuse_is_named_on_standard_error_with_status_2) {
 }
 
 TEST(nrxctl_program, numbers_that_are_none_or_out_of_range_end_it_with_status_1) {
-    for (const auto& [words, message] : std::vector<std::pair<std::string, std::string>>{
+    for (const auto& [words, message] : rows<std::string, std::string>{
              {"--report accel d0", "report id is invalid (d0)\n"},
              {"--report accel 256", "report id is invalid (256)\n"},
              {"--sensor accel two", "level is invalid (two)\n"},
@@ -116,7 +109,7 @@ TEST(nrxctl_program, shows_a_sensor_at_level_1_unless_told_otherwise) {
 TEST(nrxctl_program, writes_one_line_at_a_time) {
     for (const std::string words : {"--sensor accel 2", "--sensor nobody 2", "--replay help",
                                     "--replay get-status", "--replay generate gyro sin 1 5"}) {
-        const auto writes = writes_of(program, split(words, ' '));
+        const auto writes = writes_of(program, split(words));
         EXPECT_GE(writes.size(), 5U) << words;
         for (const std::string& text : writes) {
             // Some lines are followed by empty ones.
@@ -178,18 +171,12 @@ TEST(nrxctl_program, prints_the_transfers_of_a_bus) {
 }
 
 TEST(nrxctl_program, what_waits_takes_no_processor_time_and_ends_at_once_when_interrupted) {
-    struct waiting {
-        std::string words;
-        std::string begins;
-        std::string ends;
-        std::chrono::milliseconds grace;
-    };
-    for (const auto& [words, begins, ends, grace] : {
-             waiting{"--profile monitor", "humanReadable=disabled)\n", "\ndone\n", 90ms},
-             waiting{"--events --version", "[accelerometer] ", "\nnrxctl " NRXCTL_VERSION "\n",
-                     0ms},
+    for (const auto& [words, begins, ends, grace] :
+         rows<std::string, std::string, std::string, std::chrono::milliseconds>{
+             {"--profile monitor", "humanReadable=disabled)\n", "\ndone\n", 90ms},
+             {"--events --version", "[accelerometer] ", "\nnrxctl " NRXCTL_VERSION "\n", 0ms},
          }) {
-        running_program waiter(program, split(words, ' '));
+        running_program waiter(program, split(words));
         ASSERT_TRUE(waiter.wait_for(begins));
         std::this_thread::sleep_for(500ms);
         const auto interrupted = std::chrono::steady_clock::now();
@@ -204,18 +191,13 @@ TEST(nrxctl_program, what_waits_takes_no_processor_time_and_ends_at_once_when_in
 }
 
 TEST(nrxctl_program, interrupted_as_soon_as_it_begins_it_ends_all_the_same) {
-    struct beginning {
-        std::string words;
-        std::string begins;
-        std::string ends;
-    };
     const std::string found = "Found an id for service = 16\n";
-    for (const auto& [words, begins, ends] : {
-             beginning{"--profile human auto wake:all", "humanReadable=enabled)\n", "done\n"},
-             beginning{"--spi-status 0x10 1", found, found},
+    for (const auto& [words, begins, ends] : rows<std::string, std::string, std::string>{
+             {"--profile human auto wake:all", "humanReadable=enabled)\n", "done\n"},
+             {"--spi-status 0x10 1", found, found},
          }) {
         for (int round = 0; round < 10; ++round) {
-            running_program begun(program, split(words, ' '));
+            running_program begun(program, split(words));
             ASSERT_TRUE(begun.wait_for(begins));
             std::this_thread::sleep_for(round * 200us);
             begun.send_interrupt();
@@ -226,7 +208,7 @@ TEST(nrxctl_program, interrupted_as_soon_as_it_begins_it_ends_all_the_same) {
 }
 
 TEST(nrxctl_program, interrupted_in_a_stream_twice_and_in_the_grace_it_ends_once) {
-    running_program monitor(program, split("--profile auto sensor:accel:data", ' '));
+    running_program monitor(program, split("--profile auto sensor:accel:data"));
     ASSERT_TRUE(monitor.wait_for("prof-event 02020002"));
     monitor.send_interrupt();
     monitor.send_interrupt();
@@ -259,7 +241,7 @@ TEST(nrxctl_program, calls_drivers_beside_their_reports_and_tells_how_it_went) {
 
 TEST(nrxctl_program, prints_hid_events_for_a_time_a_whole_line_per_write) {
     const auto started = std::chrono::steady_clock::now();
-    const auto lines = writes_of(program, split("--events 2", ' '));
+    const auto lines = writes_of(program, split("--events 2"));
     EXPECT_GE(std::chrono::steady_clock::now() - started, 2s);
     const auto beginning = [&](const std::string& text) {
         return std::count_if(lines.begin(), lines.end(),
@@ -284,7 +266,7 @@ TEST(nrxctl_program, prints_hid_events_for_a_time_a_whole_line_per_write) {
 
 TEST(nrxctl_program, spi_status_is_switched_off_again_when_interrupted) {
     const std::string found = "Found an id for service = 17\n";
-    running_program watch(program, split("--spi-status gyro 2", ' '));
+    running_program watch(program, split("--spi-status gyro 2"));
     ASSERT_TRUE(watch.wait_for("STATUS: errorCode(0x7001)"));
     watch.send_interrupt();
     EXPECT_EQ(watch.finish(), 0);

@@ -2,7 +2,6 @@
 
 #include <sstream>
 
-#include "nrxctl/profiler/split.h"
 #include "tests/profiler/profiler_host.h"
 #include "tests/support/word_vector.h"
 
@@ -43,7 +42,7 @@ parsed parse(const std::string& word) {
 }  // namespace
 
 TEST(config_grammar, words_become_one_record_per_component) {
-    const std::vector<std::pair<std::string, std::string>> rows{
+    const rows<std::string, std::string> cases{
         {"sensor:accel,gyro:data,lat", "2.0 0 5; 2.1 0 5"},
         {"exec:command:command:all", "0.3 0 1f 006c6c61"},
         {"sensor:accel:stop", "2.0 1 0"},
@@ -92,7 +91,7 @@ TEST(config_grammar, words_become_one_record_per_component) {
          "9.0 0 0; 9.1 0 0; 9.2 0 0; 9.3 0 0; 9.4 0 0; 9.5 0 0"},
         {"wake:wake", "10.0 0 ffff"},
     };
-    for (const auto& [word, configs] : rows) {
+    for (const auto& [word, configs] : cases) {
         const parsed one = parse(word);
         EXPECT_TRUE(one.result) << word;
         EXPECT_EQ(described(one.configs), configs) << word;
@@ -102,7 +101,7 @@ TEST(config_grammar, words_become_one_record_per_component) {
 
 TEST(config_grammar, every_report_word_has_its_bits) {
     // A component; words and their masks.
-    const std::vector<std::pair<std::string, std::string>> rows{
+    const rows<std::string, std::string> cases{
         {"exec:command", "all ffffffff command 1f report e0"},
         {"exec:extfunction", "all ffffffff"},
         {"trace:mbi", "all ffffffff"},
@@ -121,7 +120,7 @@ TEST(config_grammar, every_report_word_has_its_bits) {
          "ch10 400 ch11 800 ch12 1000 ch13 2000 ch14 4000 ch15 8000"},
         {"wake:wake", "all ffff wake-req-stats 1 wake-req-info 2 wake-event-info 4"},
     };
-    for (const auto& [component, words_and_masks] : rows) {
+    for (const auto& [component, words_and_masks] : cases) {
         std::istringstream from(words_and_masks);
         std::string word;
         std::uint32_t mask = 0;
@@ -135,42 +134,36 @@ TEST(config_grammar, every_report_word_has_its_bits) {
 }
 
 TEST(config_grammar, words_that_fail_are_reported_and_keep_what_came_before) {
-    struct failing_row {
-        std::string word;
-        std::string configs;
-        std::string reports;
-    };
     const std::string too_many_services =
         failed(grammar_file, "service_i < (sizeof(config.services) / sizeof(config.services[0]))");
     const std::string unknown_component =
         failed(grammar_file, "enable_num_components") + failed(grammar_file, "result");
-    const std::vector<failing_row> rows{
-        {"", "", ""},
-        {"exec", "", ""},
-        {"exec:", "", ""},
-        {"exec:thread:all:svc1:x", "", ""},
-        {"exce:thread", "", failed(grammar_file, "false")},
-        {"Exec:thread", "", failed(grammar_file, "false")},
-        {"all:all", "", failed(grammar_file, "false")},
-        {"exec:thread,function", "", failed(grammar_file, "components.size() == 1")},
-        {"exec::all", "", failed(grammar_file, "components.size() == 1")},
-        {"exec:3", "", unknown_component},
-        {"sensor:7", "", unknown_component},
-        {"sensor:gyro,all,accel", "2.1 0 ffff", unknown_component},
-        {"sensor:gyro,,accel", "2.1 0 ffff", unknown_component},
-        {"trace:endpoint:all:1,2,3,4,5,6,7,8,9", "", too_many_services},
-    };
-    for (const failing_row& row : rows) {
-        const parsed one = parse(row.word);
-        EXPECT_FALSE(one.result) << row.word;
-        EXPECT_EQ(described(one.configs), row.configs) << row.word;
-        EXPECT_EQ(one.written.err, row.reports) << row.word;
-        EXPECT_EQ(one.written.out, "") << row.word;
+    for (const auto& [word, configs, reports] : rows<std::string, std::string, std::string>{
+             {"", "", ""},
+             {"exec", "", ""},
+             {"exec:", "", ""},
+             {"exec:thread:all:svc1:x", "", ""},
+             {"exce:thread", "", failed(grammar_file, "false")},
+             {"Exec:thread", "", failed(grammar_file, "false")},
+             {"all:all", "", failed(grammar_file, "false")},
+             {"exec:thread,function", "", failed(grammar_file, "components.size() == 1")},
+             {"exec::all", "", failed(grammar_file, "components.size() == 1")},
+             {"exec:3", "", unknown_component},
+             {"sensor:7", "", unknown_component},
+             {"sensor:gyro,all,accel", "2.1 0 ffff", unknown_component},
+             {"sensor:gyro,,accel", "2.1 0 ffff", unknown_component},
+             {"trace:endpoint:all:1,2,3,4,5,6,7,8,9", "", too_many_services},
+         }) {
+        const parsed one = parse(word);
+        EXPECT_FALSE(one.result) << word;
+        EXPECT_EQ(described(one.configs), configs) << word;
+        EXPECT_EQ(one.written.err, reports) << word;
+        EXPECT_EQ(one.written.out, "") << word;
     }
 }
 
 TEST(config_grammar, words_that_are_no_numbers_of_32_bits_end_the_process) {
-    const std::vector<std::pair<std::string, std::string>> rows{
+    const rows<std::string, std::string> cases{
         {"trace:bogus", "component is invalid (bogus)\n"},
         {"trace:,endpoint:all", "component is invalid ()\n"},
         {"trace:-1", "component is invalid (-1)\n"},
@@ -181,7 +174,7 @@ TEST(config_grammar, words_that_are_no_numbers_of_32_bits_end_the_process) {
         {"wake:wake:4294967296", "report mask is invalid (4294967296)\n"},
         {"orrin:orrin:0x", "report mask is invalid (0x)\n"},
     };
-    for (const auto& [word, message] : rows) {
+    for (const auto& [word, message] : cases) {
         const parsed one = parse(word);
         EXPECT_EQ(one.written.status, 1) << word;
         EXPECT_EQ(one.written.out, message) << word;
@@ -208,16 +201,6 @@ TEST(config_grammar, all_words_that_are_left_are_taken_up_to_the_first_that_fail
     EXPECT_EQ(written.err, failed(grammar_file, "result"));
     EXPECT_EQ(configs.size(), 1U);
     EXPECT_EQ(index, 4);
-}
-
-TEST(config_grammar, split_keeps_empty_fields_but_for_the_last) {
-    const std::vector<std::pair<std::string_view, std::vector<std::string_view>>> rows{
-        {"", {}},          {":", {""}},   {"::", {"", ""}},
-        {"a", {"a"}},      {"a:", {"a"}}, {"a::b", {"a", "", "b"}},
-        {":b", {"", "b"}},
-    };
-    for (const auto& [text, fields] : rows)
-        EXPECT_EQ(nrx::split(text, ':'), fields) << text;
 }
 
 }  // namespace tests

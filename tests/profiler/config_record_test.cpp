@@ -35,41 +35,40 @@ TEST(config_record, is_52_whole_bytes_with_every_field_in_its_place) {
 }
 
 TEST(config_record, prints_as_a_line) {
-    struct print_row {
-        profiler_config config;
-        std::string line;
-    };
     constexpr auto unknown_state = static_cast<profiler_state>(3);
-    const std::vector<print_row> rows{
-        {{.profiler = 2, .component = 1, .reports = 0x5},
+    const rows<profiler_config, std::string> cases{
+        {profiler_config{.profiler = 2, .component = 1, .reports = 0x5},
          "    profiler sensor     is enabled [component=gyro, reports=5]\n"},
-        {{.profiler = 2, .component = 9, .state = profiler_state::disable, .reports = 0},
+        {profiler_config{
+             .profiler = 2, .component = 9, .state = profiler_state::disable, .reports = 0},
          "    profiler sensor     is disabled [component=9, reports=0]\n"},
-        {{.profiler = 10, .state = profiler_state::stop},
+        {profiler_config{.profiler = 10, .state = profiler_state::stop},
          "    profiler wake       is stopd [component=, reports=ffffffff]\n"},
-        {{.profiler = 5, .state = unknown_state, .reports = 0xffff},
+        {profiler_config{.profiler = 5, .state = unknown_state, .reports = 0xffff},
          "    profiler interrupt  is unknownd [component=gpio, reports=ffff]\n"},
-        {{.profiler = 7, .component = 3},
+        {profiler_config{.profiler = 7, .component = 3},
          "    profiler 7          is enabled [component=3, reports=ffffffff]\n"},
-        {{.profiler = 8, .component = 2},
+        {profiler_config{.profiler = 8, .component = 2},
          "    profiler control    is enabled [component=2, reports=ffffffff]\n"},
-        {{.profiler = 4294967295, .component = 4294967295},
+        {profiler_config{.profiler = 4294967295, .component = 4294967295},
          "    profiler 4294967295 is enabled [component=4294967295, reports=ffffffff]\n"},
-        {{.profiler = 0, .component = 3, .reports = 0x1f, .services = {0x006c6c61}},
+        {profiler_config{.profiler = 0, .component = 3, .reports = 0x1f, .services = {0x006c6c61}},
          "    profiler exec       is enabled [component=command, reports=1f services= all]\n"},
-        {{.profiler = 0, .component = 4, .services = {0x736e6573, 0x62, 0, 0x63}},
+        {profiler_config{.profiler = 0, .component = 4, .services = {0x736e6573, 0x62, 0, 0x63}},
          "    profiler exec       is enabled [component=extfunction, reports=ffffffff services= "
          "sens b]\n"},
-        {{.profiler = 0, .component = 2, .services = {0x61}},
+        {profiler_config{.profiler = 0, .component = 2, .services = {0x61}},
          "    profiler exec       is enabled [component=workloop, reports=ffffffff]\n"},
-        {{.profiler = 1, .component = 4},
+        {profiler_config{.profiler = 1, .component = 4},
          "    profiler trace      is enabled [component=4, reports=ffffffff services=]\n"},
-        {{.profiler = 1, .component = 3, .services = {0x62006100, 0x61}},
+        {profiler_config{.profiler = 1, .component = 3, .services = {0x62006100, 0x61}},
          "    profiler trace      is enabled [component=interrupt, reports=ffffffff services=  "
          "a]\n"},
     };
-    for (const print_row& row : rows)
-        EXPECT_EQ(capture([&] { nrx::print_profiler_config(row.config); }).out, row.line);
+    for (const auto& row : cases) {
+        EXPECT_EQ(capture([&] { nrx::print_profiler_config(std::get<0>(row)); }).out,
+                  std::get<1>(row));
+    }
 }
 
 }  // namespace tests

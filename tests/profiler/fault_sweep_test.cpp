@@ -22,10 +22,10 @@ std::unique_ptr<machine> make_host() {
 
 using family_command = void (*)(std::string_view, std::span<char* const>, int&);
 
-// Sweeps a command with its first argument and its further words, commas between them.
+// Sweeps a command with its first argument and its further words.
 void sweep(family_command command, const std::string& words,
            const std::function<bool(const fault&)>& acceptable) {
-    const word_vector all(between_commas(words));
+    const word_vector all(split(words));
     const auto operation = [&] {
         int index = 1;
         command(all.all()[0], all.all(), index);
@@ -69,23 +69,23 @@ bool is_reported_or_without_driver(const fault& one) {
 
 TEST(profiler_fault_sweep, subcommands_report_every_failure_that_is_no_probe) {
     for (const char* words : {"clear-eventsources", "eventsources", "wqrfw-wakestats", "enable",
-                              "disable", "on-error,panic"}) {
+                              "disable", "on-error panic"}) {
         // The first of the two look-ups of a service by name may find nothing.
         sweep(nrx::profile_command, words, [](const fault& one) {
             return !one.result.err.empty() || one.how == failure::nothing || one.call == 1;
         });
     }
-    for (const char* words : {"stop", "flush", "config,sensor:accel"})
+    for (const char* words : {"stop", "flush", "config sensor:accel"})
         sweep(nrx::profile_command, words, is_reported_or_foreseen);
     sweep(nrx::profile_command, "get-config", is_reported_or_shown_as_none);
-    for (const char* words : {"signal-errdump", "get-logs,errdump,fwdump", "get-logs,human"})
+    for (const char* words : {"signal-errdump", "get-logs errdump fwdump", "get-logs human"})
         sweep(nrx::profile_command, words, is_reported_or_without_driver);
 }
 
 TEST(profiler_fault_sweep, monitors_report_end_and_leave_nothing_open) {
     nrx::tick_period = platform::tick_period();
-    sweep(nrx::profile_command, "40,sensor:accel", is_reported_or_foreseen);
-    sweep(nrx::scm_monitor, "40,scm:spi0:ch0", is_reported_or_foreseen);
+    sweep(nrx::profile_command, "40 sensor:accel", is_reported_or_foreseen);
+    sweep(nrx::scm_monitor, "40 scm:spi0:ch0", is_reported_or_foreseen);
 }
 
 }  // namespace tests

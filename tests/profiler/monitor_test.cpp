@@ -41,13 +41,6 @@ protected:
     void arrive(std::chrono::milliseconds at, const byte_list& entry) {
         host.clock().plan(at, [this, entry] { driver->queue->add(entry); });
     }
-    void interrupt_at(std::chrono::milliseconds at) {
-        host.clock().plan(at, [] { std::raise(SIGINT); });
-    }
-    // Lets the driver end the stream when it is asked to.
-    void end_on_stop() {
-        driver->actions[11] = [this] { driver->queue->add(marker); };
-    }
 
     run watch(std::uint32_t duration = 0) {
         log_read_ = false;
@@ -64,32 +57,23 @@ private:
 };
 
 TEST(monitor_words, give_duration_and_human_flag_and_are_announced) {
-    struct argument_row {
-        std::vector<std::string> words;
-        std::uint32_t duration;
-        bool human;
-        int taken;
-        std::string line;
-    };
-    const std::vector<argument_row> rows{
-        {{}, 0, false, 0, "0 us mode=auto (humanReadable=disabled)\n"},
-        {{"human"}, 0, true, 1, "0 us mode=auto (humanReadable=enabled)\n"},
-        {{"human", "250", "x"}, 250000, true, 2, "250000 us mode=enable (humanReadable=enabled)\n"},
-        {{"auto", "human"}, 0, false, 1, "0 us mode=auto (humanReadable=disabled)\n"},
-        {{"0x10"}, 16000, false, 1, "16000 us mode=enable (humanReadable=disabled)\n"},
-        {{"0"}, 0, false, 1, "0 us mode=auto (humanReadable=disabled)\n"},
-        {{"4294967"}, 4294967000, false, 1, "-296 us mode=enable (humanReadable=disabled)\n"},
-    };
-    for (const argument_row& row : rows) {
-        const word_vector words(row.words);
+    for (const auto& [words, duration, human, taken, line] :
+         rows<std::string, std::uint32_t, bool, int, std::string>{
+             {"", 0, false, 0, "0 us mode=auto (humanReadable=disabled)\n"},
+             {"human", 0, true, 1, "0 us mode=auto (humanReadable=enabled)\n"},
+             {"human 250 x", 250000, true, 2, "250000 us mode=enable (humanReadable=enabled)\n"},
+             {"auto human", 0, false, 1, "0 us mode=auto (humanReadable=disabled)\n"},
+             {"0x10", 16000, false, 1, "16000 us mode=enable (humanReadable=disabled)\n"},
+             {"0", 0, false, 1, "0 us mode=auto (humanReadable=disabled)\n"},
+             {"4294967", 4294967000, false, 1, "-296 us mode=enable (humanReadable=disabled)\n"},
+         }) {
+        const word_vector all(split(words));
         int index = 0;
-        nrx::argument_words left(words.all(), index);
+        nrx::argument_words left(all.all(), index);
         nrx::monitor_args args;
-        EXPECT_EQ(capture([&] { args = nrx::parse_monitor_args(left); }).out,
-                  "duration=" + row.line);
-        EXPECT_EQ(args.duration, row.duration) << row.line;
-        EXPECT_EQ(args.human, row.human) << row.line;
-        EXPECT_EQ(index, row.taken) << row.line;
+        EXPECT_EQ(capture([&] { args = nrx::parse_monitor_args(left); }).out, "duration=" + line);
+        EXPECT_EQ(std::tuple(args.duration, args.human, index), std::tuple(duration, human, taken))
+            << line;
     }
     for (const std::string word : {"", "human", "Auto", "-1", "4294968", "1s"}) {
         const outcome refused = capture([&] { nrx::parse_duration(word); });
@@ -105,39 +89,41 @@ TEST_F(monitor, stream_is_printed_as_it_comes_until_the_end_marker) {
     arrive(20ms, marker);
     EXPECT_EQ(watch(), ended(dumped(3, 1) + dumped(3, 2) + dumped(3, 3)));
     EXPECT_EQ(host.clock().now(), 120ms);
-    EXPECT_EQ(happened(), (std::vector<std::string>{
-                              "open KeltoNRXProfileDriver type 0",
-                              "map KeltoNRXProfileDriver memory 0",
-                              "allocate port",
-                              "attach port to KeltoNRXProfileDriver notification 0 reference 0",
-                              "open profile type 0",
-                              "call profile 1 scalars [0xd2] in [00 00 00 00] results 0 room 0",
-                              "close profile",
-                              "data available KeltoNRXProfileDriver",
-                              "dequeue KeltoNRXProfileDriver room 48",
-                              "data available KeltoNRXProfileDriver",
-                              "wait KeltoNRXProfileDriver",
-                              "data available KeltoNRXProfileDriver",
-                              "dequeue KeltoNRXProfileDriver room 48",
-                              "data available KeltoNRXProfileDriver",
-                              "wait KeltoNRXProfileDriver",
-                              "data available KeltoNRXProfileDriver",
-                              "dequeue KeltoNRXProfileDriver room 48",
-                              "data available KeltoNRXProfileDriver",
-                              "wait KeltoNRXProfileDriver",
-                              "data available KeltoNRXProfileDriver",
-                              "dequeue KeltoNRXProfileDriver room 48",
-                              "sleep 100000 us",
-                              "data available KeltoNRXProfileDriver",
-                              "open profile type 0",
-                              "call profile 2 scalars [0xd1] in [] results 0 room 65536",
-                              "close profile",
-                              "open profile type 0",
-                              "call profile 2 scalars [0xd1] in [] results 0 room 65536",
-                              "close profile",
-                              "unmap KeltoNRXProfileDriver",
-                              "close KeltoNRXProfileDriver",
-                          }));
+    const std::string is_there = "data available KeltoNRXProfileDriver";
+    const std::string take = "dequeue KeltoNRXProfileDriver room 48";
+    const std::string wait = "wait KeltoNRXProfileDriver";
+    const std::string read_log = "call profile 2 scalars [0xd1] in [] results 0 room 65536";
+    EXPECT_EQ(happened(), (lines{"open KeltoNRXProfileDriver type 0",
+                                 "map KeltoNRXProfileDriver memory 0",
+                                 "allocate port",
+                                 "attach port to KeltoNRXProfileDriver notification 0 reference 0",
+                                 "open profile type 0",
+                                 "call profile 1 scalars [0xd2] in [00 00 00 00] results 0 room 0",
+                                 "close profile",
+                                 is_there,
+                                 take,
+                                 is_there,
+                                 wait,
+                                 is_there,
+                                 take,
+                                 is_there,
+                                 wait,
+                                 is_there,
+                                 take,
+                                 is_there,
+                                 wait,
+                                 is_there,
+                                 take,
+                                 "sleep 100000 us",
+                                 is_there,
+                                 "open profile type 0",
+                                 read_log,
+                                 "close profile",
+                                 "open profile type 0",
+                                 read_log,
+                                 "close profile",
+                                 "unmap KeltoNRXProfileDriver",
+                                 "close KeltoNRXProfileDriver"}));
 }
 
 TEST_F(monitor, end_marker_in_every_position_lets_the_last_drain_pick_up_what_follows_it) {
@@ -201,18 +187,8 @@ TEST_F(monitor, short_entries_are_reported_and_read_as_0_beyond_their_end) {
               ended("prof-event 03ff" + std::string(92, '0') + "\n", too_short + too_short));
 }
 
-TEST_F(monitor, interrupt_asks_for_the_end_of_the_stream_however_often_it_comes) {
-    end_on_stop();
-    arrive(5ms, record_bytes(3, 1));
-    interrupt_at(10ms);
-    interrupt_at(10ms);
-    interrupt_at(60ms);
-    EXPECT_EQ(watch(), ended(dumped(3, 1)));
-    EXPECT_EQ(host.clock().now(), 110ms);
-}
-
 TEST_F(monitor, interrupt_at_any_platform_call_ends_it_in_good_order) {
-    end_on_stop();
+    driver->actions[11] = [this] { driver->queue->add(marker); };
     const auto stream_a_record = [&] {
         driver->queue->clear();
         driver->queue->add(record_bytes(3, 1));
@@ -234,7 +210,7 @@ TEST_F(monitor, interrupt_at_any_platform_call_ends_it_in_good_order) {
 
 TEST_F(monitor, interrupt_that_the_driver_refuses_is_reported_and_the_monitor_goes_on) {
     driver->answers[11] = {{.code = platform::simulated::io_failure}};
-    interrupt_at(10ms);
+    host.clock().plan(10ms, [] { std::raise(SIGINT); });
     arrive(20ms, marker);
     EXPECT_EQ(watch(), ended("", failed(kernel_file, "kr == 0 ", io_text)));
 }

@@ -45,6 +45,17 @@ byte_list joined(const std::vector<byte_list>& lists) {
     return all;
 }
 
+std::string config_bytes(const std::string& profiler, const std::string& component,
+                         const std::string& state, const std::string& mask) {
+    std::string bytes;
+    for (const std::string& byte : {profiler, component, state})
+        bytes += byte + " 00 00 00 ";
+    bytes += mask;
+    for (int i = 0; i < 36; ++i)
+        bytes += " 00";
+    return bytes;
+}
+
 void profiler_test::SetUp() {
     device_test::SetUp();
     nrx::tick_period = platform::tick_period();
@@ -94,18 +105,17 @@ bool has_default_action() {
     return current.sa_handler == SIG_DFL;
 }
 
-std::vector<std::string> profiler_test::happened() {
-    std::vector<std::string> lines(host.log().begin() + static_cast<std::ptrdiff_t>(seen_),
-                                   host.log().end());
+lines profiler_test::happened() {
+    lines news(host.log().begin() + static_cast<std::ptrdiff_t>(seen_), host.log().end());
     seen_ = host.log().size();
-    std::erase_if(lines, [](const std::string& line) {
+    std::erase_if(news, [](const std::string& line) {
         return line.starts_with("first match") || line.starts_with("release ");
     });
-    return lines;
+    return news;
 }
 
-outcome profiler_test::profile(std::vector<std::string> words) {
-    const word_vector all(std::move(words));
+outcome profiler_test::profile(const std::string& words) {
+    const word_vector all(split(words));
     int index = 1;
     outcome written = capture([&] { nrx::profile_command(all.all()[0], all.all(), index); });
     taken = index - 1;

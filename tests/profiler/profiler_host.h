@@ -10,8 +10,11 @@
 #include "nrxctl/base/profile_record.h"
 #include "tests/support/device_test.h"
 #include "tests/support/report_bytes.h"
+#include "tests/support/rows.h"
 
 namespace tests {
+
+using lines = std::vector<std::string>;
 
 inline constexpr const char* driver_name = "KeltoNRXProfileDriver";
 
@@ -49,6 +52,11 @@ std::string dumped(std::uint8_t type, std::uint8_t mark);
 // Several byte lists, one after the other.
 byte_list joined(const std::vector<byte_list>& lists);
 
+// A configuration record without services in the words of the log: bytes of profiler, component and
+// state, and the report mask.
+std::string config_bytes(const std::string& profiler, const std::string& component,
+                         const std::string& state, const std::string& mask);
+
 // Whether an interrupt would end the process.
 bool has_default_action();
 
@@ -83,10 +91,10 @@ protected:
 
     // The calls and what else happened on the host since the last time, but for services looked up
     // and released.
-    std::vector<std::string> happened();
+    lines happened();
 
     // Runs a subcommand as the command line gives it; taken is then how many further words it took.
-    outcome profile(std::vector<std::string> words);
+    outcome profile(const std::string& words);
     int taken = 0;
 
     scripted_driver* driver = nullptr;

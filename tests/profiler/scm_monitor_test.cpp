@@ -9,19 +9,14 @@
 
 namespace tests {
 
-using lines = std::vector<std::string>;
-
 namespace {
 
 constexpr const char* scm_file = "profiler/scm_monitor.cpp";
 
-// A configuration record of "scm".
 std::string config(const std::string& component, const std::string& state,
                    const std::string& mask) {
-    std::string bytes = "09 00 00 00 " + component + " 00 00 00 " + state + " 00 00 00 " + mask;
-    for (int i = 0; i < 36; ++i)
-        bytes += " 00";
-    return "call profile 3 scalars [0x24] in [" + bytes + "] results 0 room 0";
+    return "call profile 3 scalars [0x24] in [" + config_bytes("09", component, state, mask) +
+           "] results 0 room 0";
 }
 
 const std::string duration_call = "call profile 1 scalars [0xd2] in [10 27 00 00] results 0 room 0";
@@ -39,8 +34,8 @@ protected:
         driver->queue->add(record_bytes(0, 0));
     }
 
-    static outcome monitor(const std::string& duration, lines words = {"scm:smb1:ch7"}) {
-        const word_vector further(std::move(words));
+    static outcome monitor(const std::string& duration, const std::string& words = "scm:smb1:ch7") {
+        const word_vector further(split(words));
         int index = 0;
         return capture([&] { nrx::scm_monitor(duration, further.all(), index); });
     }
@@ -125,16 +120,16 @@ TEST_F(scm_monitor, interrupted_in_its_wait_it_stops_the_stream_and_puts_everyth
 }
 
 TEST_F(scm_monitor, ends_early_without_profiler_status_duration_or_configurations) {
-    EXPECT_EQ(monitor("10", {"scm:smb1"}).out, "wqr fw profiler is not available\n");
+    EXPECT_EQ(monitor("10", "scm:smb1").out, "wqr fw profiler is not available\n");
     put_profile_service();
-    EXPECT_EQ(monitor("10", {"scm:smb1"}).err, failed(conn_file, "service") +
-                                                   failed(kernel_file, "success") +
-                                                   failed(scm_file, "success"));
+    EXPECT_EQ(monitor("10", "scm:smb1").err, failed(conn_file, "service") +
+                                                 failed(kernel_file, "success") +
+                                                 failed(scm_file, "success"));
     put_driver();
-    EXPECT_EQ(monitor("10", {}).err, failed(scm_file, "configs.size() != 0"));
-    EXPECT_EQ(monitor("auto", {"smb1"}).err,
+    EXPECT_EQ(monitor("10", "").err, failed(scm_file, "configs.size() != 0"));
+    EXPECT_EQ(monitor("auto", "smb1").err,
               failed(grammar_file, "result") + failed(scm_file, "success"));
-    const outcome refused = monitor("human", {"scm:smb1"});
+    const outcome refused = monitor("human", "scm:smb1");
     EXPECT_EQ(refused.out, "duration parameter is invalid (human)\n");
     EXPECT_EQ(refused.status, 1);
     EXPECT_EQ(logged("call"), lines(3, status_call));

@@ -56,12 +56,7 @@ TEST_F(generate, writes_a_line_per_sample) {
 }
 
 TEST_F(generate, each_signal_has_its_shape) {
-    struct shape {
-        std::string signal;
-        std::string count;
-        std::string values;
-    };
-    for (const auto& [signal, count, values] : std::vector<shape>{
+    for (const auto& [signal, count, values] : rows<std::string, std::string, std::string>{
              {"step", "5", "00010000 00010000 00000000 00000000 00000000 "},
              {"step", "1", "00000000 "},
              // Cut towards zero on both sides: 65536 times 0.5, 0.7071 and 0.8660.
@@ -97,21 +92,16 @@ TEST_F(generate, random_values_are_the_c_librarys_after_a_seed_of_the_time) {
 }
 
 TEST_F(generate, a_frequency_makes_one_period_in_which_there_must_be_a_sample) {
-    struct frequency_row {
-        std::string interval;
-        std::string frequency;
-        std::ptrdiff_t samples;
-        std::string check = "";
-    };
     // The low 32 bits of a frequency, and of its product with the interval, count.
-    for (const auto& [interval, frequency, samples, check] : std::vector<frequency_row>{
-             {"10000", "1hz", 100},
-             {"10000", "100Hz", 1},
-             {"1000", "0x32hz", 20},
-             {"1", "300000hz", 3},
-             {"1", "1000000hz", 1},
-             {"1", "0x1000186a0hz", 10},
-             {"65536", "65537hz", 15},
+    for (const auto& [interval, frequency, samples, check] :
+         rows<std::string, std::string, std::ptrdiff_t, std::string>{
+             {"10000", "1hz", 100, ""},
+             {"10000", "100Hz", 1, ""},
+             {"1000", "0x32hz", 20, ""},
+             {"1", "300000hz", 3, ""},
+             {"1", "1000000hz", 1, ""},
+             {"1", "0x1000186a0hz", 10, ""},
+             {"65536", "65537hz", 15, ""},
              {"10000", "101hz", 0, "num_samples"},
              {"1", "1000001hz", 0, "num_samples"},
              {"0", "1hz", 0, "num_samples"},
@@ -134,7 +124,7 @@ TEST_F(generate, words_that_are_missing_or_no_numbers_are_refused_in_order) {
         EXPECT_EQ(result.err, failed("replay/signal_request.cpp", "argc >= optind+4"));
         EXPECT_EQ(result.out, "");
     }
-    for (const auto& [words, message] : std::vector<std::pair<lines, std::string>>{
+    for (const auto& [words, message] : rows<lines, std::string>{
              {{"a", "b", "c", "d"}, "invalid interval (c)"},
              {{"a", "b", "1", "d"}, "invalid number of samples (d)"},
              {{"a", "b", "1", "5HZ"}, "invalid number of samples (5HZ)"},

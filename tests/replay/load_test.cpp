@@ -81,12 +81,7 @@ TEST_F(load_subcommand, counts_events_and_bytes_beyond_one_byte) {
 }
 
 TEST_F(load_subcommand, words_choose_filter_completion_and_location) {
-    struct options_row {
-        lines words;
-        lines request_words;  // completion, location, filter, byte count
-        int taken;
-    };
-    for (const auto& [words, request_words, taken_words] : std::vector<options_row>{
+    for (const auto& [words, request_words, taken_words] : rows<lines, lines, int>{
              {{}, {"01", "01", "00", "1c"}, 1},
              {{"filter"}, {"01", "01", "01", "1c"}, 2},
              {{"default"}, {"00", "01", "00", "1c"}, 2},
@@ -104,7 +99,7 @@ TEST_F(load_subcommand, words_choose_filter_completion_and_location) {
 }
 
 TEST_F(load_subcommand, words_that_are_none_of_these_stop_it_before_the_file_is_read) {
-    for (const auto& [words, message] : std::vector<std::pair<lines, std::string>>{
+    for (const auto& [words, message] : rows<lines, std::string>{
              {{"Filter"}, "Invalid completion: Filter\n"},
              {{"filter", "filter"}, "Invalid completion: filter\n"},
              {{"sram"}, "Invalid completion: sram\n"},
@@ -119,17 +114,14 @@ TEST_F(load_subcommand, words_that_are_none_of_these_stop_it_before_the_file_is_
 }
 
 TEST_F(load_subcommand, a_file_without_samples_or_with_a_bad_line_uploads_nothing) {
-    struct bad_file {
-        std::string text;
-        std::string out;
-        std::string err;
-        std::optional<int> status = std::nullopt;
-    };
     const std::string good = sample("accel", "1", "1");
-    for (const auto& [text, out, err, status] : std::vector<bad_file>{
-             {"# nothing\n\nnobody\n", "Warning: Unknown event tag nobody\n", ""},
-             {good + "accel,x\n", "",
-              failed("replay/sample_file.cpp", "pair.size() == 2") + refused},
+    for (const auto& [text, out, err, status] :
+         rows<std::string, std::string, std::string, std::optional<int>>{
+             {"# nothing\n\nnobody\n", "Warning: Unknown event tag nobody\n", "", {}},
+             {good + "accel,x\n",
+              "",
+              failed("replay/sample_file.cpp", "pair.size() == 2") + refused,
+              {}},
              {good + "accel,sampleid=x\n", "error converting samples (x)\n", "", 1},
          }) {
         const auto result = load(text);
@@ -193,7 +185,7 @@ TEST_F(load_subcommand, what_fails_in_the_upload_is_reported_and_leaves_what_was
         replay({"unload", "accel"});
         EXPECT_EQ(replay({"get-status"}).out.find(" is loaded"), std::string::npos) << reports;
     };
-    for (const auto& [call, reports] : std::vector<std::pair<std::size_t, std::string>>{
+    for (const auto& [call, reports] : rows<std::size_t, std::string>{
              {3, refused},
              {4, failed(conn_file, "service") + refused},
              {5, failed(conn_file, "child") + refused},

@@ -7,6 +7,7 @@
 
 #include "tests/support/device_test.h"
 #include "tests/support/report_bytes.h"
+#include "tests/support/rows.h"
 
 namespace tests {
 

@@ -56,11 +56,7 @@ std::string at(const std::string& tag, const std::string& id, const std::string&
 }  // namespace
 
 TEST(sample_file, reads_what_the_grammar_allows) {
-    struct accepted {
-        std::string text;
-        std::string events;
-    };
-    for (const auto& [text, events] : std::vector<accepted>{
+    for (const auto& [text, events] : rows<std::string, std::string>{
              {"", ""},
              {"\n\n\n", ""},
              {accel("k=v"), accel_event},            // keys that nobody reads, no line feed
@@ -122,11 +118,7 @@ TEST(sample_file, a_file_that_cannot_be_read_is_reported) {
 }
 
 TEST(sample_file, a_value_that_is_missing_or_no_number_ends_the_process) {
-    struct refused {
-        std::string line;
-        std::string message;
-    };
-    for (const auto& [line, message] : std::vector<refused>{
+    for (const auto& [line, message] : rows<std::string, std::string>{
              // The first in the order of reading is named.
              {"accel", "error converting samples ()"},
              {"accel,sampleid=a,temperature=b", "error converting samples (a)"},
@@ -162,13 +154,8 @@ TEST(sample_file, a_value_that_is_missing_or_no_number_ends_the_process) {
 }
 
 TEST(sample_file, numbers_keep_their_low_32_bits) {
-    struct number_row {
-        std::string written;
-        std::string sampleid;
-        std::string x;
-        std::string timestamp;
-    };
-    for (const auto& [written, sampleid, x, timestamp] : std::vector<number_row>{
+    for (const auto& [written, sampleid, x, timestamp] :
+         rows<std::string, std::string, std::string, std::string>{
              {"+7", "7", "7", "7"},
              {"007", "7", "7", "7"},
              {"0xffff0000", "4294901760", "-65536", "18446744073709486080"},
@@ -186,13 +173,19 @@ TEST(sample_file, numbers_keep_their_low_32_bits) {
 }
 
 TEST(sample_file, temperatures_are_degrees_with_16_fraction_bits_cut_towards_zero) {
-    const std::vector<std::pair<std::string, std::string>> rows{
-        {"2880", "1887436"},     {"-2880", "-1887436"},  {"1", "655"},
-        {"-1", "-655"},          {"100", "65536"},       {"32767", "21474181"},
-        {"32768", "-21474836"},  {"-32769", "21474181"}, {"65536", "0"},
-        {"0x8000", "-21474836"}, {"4294967296000", "0"},
-    };
-    for (const auto& [hundredths, degrees] : rows) {
+    for (const auto& [hundredths, degrees] : rows<std::string, std::string>{
+             {"2880", "1887436"},
+             {"-2880", "-1887436"},
+             {"1", "655"},
+             {"-1", "-655"},
+             {"100", "65536"},
+             {"32767", "21474181"},
+             {"32768", "-21474836"},
+             {"-32769", "21474181"},
+             {"65536", "0"},
+             {"0x8000", "-21474836"},
+             {"4294967296000", "0"},
+         }) {
         EXPECT_EQ(read(accel("temperature=" + hundredths)).events,
                   "accel 28 0 1 " + degrees + " 2 3 4 @5\n");
         EXPECT_EQ(read("pressure,sampleid=1,p=2,timestamp=5,temperature=" + hundredths).events,

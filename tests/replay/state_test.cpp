@@ -42,7 +42,7 @@ TEST_F(replay_states, whole_entries_alone_are_read) {
         capture([&] { read = nrx::replay_status(); });
         return read;
     };
-    for (const auto& [size, count] : std::vector<std::pair<std::size_t, std::size_t>>{
+    for (const auto& [size, count] : rows<std::size_t, std::size_t>{
              {0, 0}, {1, 0}, {11, 0}, {12, 1}, {16, 1}, {384, 32}, {385, 0}}) {
         EXPECT_EQ(status(size).size(), count) << size;
     }
@@ -91,12 +91,7 @@ TEST_F(replay_states, every_subcommand_that_needs_replay_says_that_it_is_not_ena
 
 TEST_F(replay_states, are_set_for_all_services_in_the_order_of_the_words) {
     answer_with(byte_list(12));
-    struct setting {
-        lines words;
-        std::string delay;
-        std::string state;
-    };
-    for (const auto& [words, delay, state] : std::vector<setting>{
+    for (const auto& [words, delay, state] : rows<lines, std::string, std::string>{
              {{"enable"}, "00 00 00 00", "02"},
              {{"disable"}, "00 00 00 00", "01"},
              {{"schedule-enable", "0x10203"}, "03 02 01 00", "02"},

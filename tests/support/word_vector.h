@@ -2,23 +2,20 @@
 #pragma once
 
 #include <span>
+#include <sstream>
 #include <string>
 #include <utility>
 #include <vector>
 
 namespace tests {
 
-// The words of a text with commas between them.
-inline std::vector<std::string> between_commas(const std::string& text) {
-    std::vector<std::string> words{""};
-    for (const char character : text) {
-        if (character == ',') {
-            words.emplace_back();
-        } else {
-            words.back() += character;
-        }
-    }
-    return words;
+// The pieces of a text between separators; none behind the last one, if it ends the text.
+inline std::vector<std::string> split(const std::string& text, char separator = ' ') {
+    std::vector<std::string> pieces;
+    std::istringstream from(text);
+    for (std::string piece; std::getline(from, piece, separator);)
+        pieces.push_back(piece);
+    return pieces;
 }
 
 class word_vector {
