@@ -6,6 +6,7 @@
 
 #include "nrxctl/replay/make_event.h"
 #include "tests/replay/replay_host.h"
+#include "tests/support/word_vector.h"
 
 namespace tests {
 
@@ -119,21 +120,18 @@ TEST_F(generate, a_frequency_makes_one_period_in_which_there_must_be_a_sample) {
 }
 
 TEST_F(generate, words_that_are_missing_or_no_numbers_are_refused_in_order) {
-    for (const lines& words : {lines{}, lines{"a"}, lines{"a", "b"}, lines{"a", "b", "c"}}) {
-        const auto result = run(words);
-        EXPECT_EQ(result.err, failed("replay/signal_request.cpp", "argc >= optind+4"));
-        EXPECT_EQ(result.out, "");
-    }
-    for (const auto& [words, message] : rows<lines, std::string>{
-             {{"a", "b", "c", "d"}, "invalid interval (c)"},
-             {{"a", "b", "1", "d"}, "invalid number of samples (d)"},
-             {{"a", "b", "1", "5HZ"}, "invalid number of samples (5HZ)"},
-             {{"a", "b", "1", "5hZ"}, "invalid number of samples (5hZ)"},
-             {{"a", "b", "1", "hz"}, "invalid number of samples (hz)"},
-             {{"a", "b", "1", "xhz"}, "invalid frequency (x)"},
-             {{"a", "b", "1", "1.5Hz"}, "invalid frequency (1.5)"},
+    for (const char* words : {"generate", "generate a", "generate a b", "generate a b c"})
+        says(split(words), "", failed("replay/signal_request.cpp", "argc >= optind+4"));
+    for (const auto& [words, message] : rows<std::string, std::string>{
+             {"a b c d", "invalid interval (c)"},
+             {"a b 1 d", "invalid number of samples (d)"},
+             {"a b 1 5HZ", "invalid number of samples (5HZ)"},
+             {"a b 1 5hZ", "invalid number of samples (5hZ)"},
+             {"a b 1 hz", "invalid number of samples (hz)"},
+             {"a b 1 xhz", "invalid frequency (x)"},
+             {"a b 1 1.5Hz", "invalid frequency (1.5)"},
          }) {
-        const auto result = run(words);
+        const auto result = run(split(words));
         EXPECT_EQ(result.out, message + "\n");
         EXPECT_EQ(result.status, 1);
     }

@@ -52,10 +52,8 @@ protected:
 };
 
 TEST_F(load_subcommand, checks_and_then_uploads_each_service_in_the_order_of_their_names) {
-    const auto result = load(three_services);
-    EXPECT_EQ(result.out,
+    load_says(three_services,
               "accel: loaded 1 events\ncompass: loaded 2 events\npressure: loaded 1 events\n");
-    EXPECT_EQ(result.err, "");
     EXPECT_EQ(calls(), (lines{read_state, read_state, read_state, read_state,
                               request("10 00 00 00", {"01", "01", "00", "1c"},
                                       axis_record("00 00 00 00 04 00 00 00")),
@@ -65,9 +63,9 @@ TEST_F(load_subcommand, checks_and_then_uploads_each_service_in_the_order_of_the
                               request("13 00 00 00", {"01", "01", "00", "14"},
                                       pressure_record("01 00 00 00 02 00 00 00"))}));
     EXPECT_EQ(client_uses(), "open call close open call close open call close ");
-    EXPECT_EQ(replay({"get-status"}).out,
-              "Replay status:\nService accel      is loaded\nService gyro       is inactive\n"
-              "Service compass    is loaded\nService pressure   is loaded\n");
+    says({"get-status"},
+         "Replay status:\nService accel      is loaded\nService gyro       is inactive\n"
+         "Service compass    is loaded\nService pressure   is loaded\n");
 }
 
 TEST_F(load_subcommand, counts_events_and_bytes_beyond_one_byte) {
@@ -130,15 +128,12 @@ TEST_F(load_subcommand, a_file_without_samples_or_with_a_bad_line_uploads_nothin
         EXPECT_EQ(result.status, status);
         EXPECT_EQ(calls(), lines{read_state});
     }
-    EXPECT_EQ(replay({"load", "/nonexistent/samples"}).err,
-              failed("replay/sample_file.cpp", "fs") + refused);
+    says({"load", "/nonexistent/samples"}, "", failed("replay/sample_file.cpp", "fs") + refused);
 }
 
 TEST_F(load_subcommand, a_service_without_id_or_state_refuses_the_whole_file) {
     const auto loads_nothing = [&](const std::string& reports) {
-        const auto result = load(three_services);
-        EXPECT_EQ(result.err, reports);
-        EXPECT_EQ(result.out, "");
+        load_says(three_services, "", reports);
         EXPECT_EQ(calls(), lines(3, read_state));
     };
     host.find("compass")->properties = {};
@@ -154,23 +149,19 @@ TEST_F(load_subcommand, the_first_service_that_has_samples_refuses_the_whole_fil
         load(sample("pressure", "1", "1") + sample("compass", "1", "1"));
         replay({state, "compass", "pressure"});
         calls();
-        const auto result = load(three_services);
-        EXPECT_EQ(result.out, "Service compass had already samples; you have to unload first\n");
-        EXPECT_EQ(result.err, "");
+        load_says(three_services,
+                  "Service compass had already samples; you have to unload first\n");
         EXPECT_EQ(calls(), lines(3, read_state));
         replay({"unload", "compass", "pressure"});
     }
     answer_with({0x10, 0, 0, 0, 0, 0, 0, 0, 3, 0, 0, 0});
-    EXPECT_EQ(load(three_services).out,
-              "Service accel had already samples; you have to unload first\n");
+    load_says(three_services, "Service accel had already samples; you have to unload first\n");
 }
 
 TEST_F(load_subcommand, a_state_that_cannot_be_read_again_fails_the_check) {
     // Four platform calls tell that replay is enabled: two look-ups, the opening and the call.
     host.before_call(5, [&] { host.remove("NRXApp"); });
-    const auto result = load(three_services);
-    EXPECT_EQ(result.err, failed("base/channel.cpp", "service") + refused);
-    EXPECT_EQ(result.out, "");
+    load_says(three_services, "", failed("base/channel.cpp", "service") + refused);
 }
 
 TEST_F(load_subcommand, what_fails_in_the_upload_is_reported_and_leaves_what_was_uploaded_before) {
@@ -179,9 +170,7 @@ TEST_F(load_subcommand, what_fails_in_the_upload_is_reported_and_leaves_what_was
     // call.
     constexpr std::size_t accel_uploaded = 4 + 3 * 7 + 7;
     const auto fails_with = [&](const std::string& reports) {
-        const auto result = load(three_services);
-        EXPECT_EQ(result.err, reports);
-        EXPECT_EQ(result.out, "accel: loaded 1 events\n") << reports;
+        load_says(three_services, "accel: loaded 1 events\n", reports);
         replay({"unload", "accel"});
         EXPECT_EQ(replay({"get-status"}).out.find(" is loaded"), std::string::npos) << reports;
     };
@@ -220,15 +209,13 @@ TEST_F(load_subcommand, unloading_names_what_it_cannot_unload_and_goes_on) {
 
 TEST_F(load_subcommand, unloading_needs_a_word_a_replay_application_and_its_driver) {
     const std::string unload_file = "replay/unload_subcommand.cpp";
-    EXPECT_EQ(replay({"unload"}).err, failed(unload_file, "argc > optind"));
+    says({"unload"}, "", failed(unload_file, "argc > optind"));
     EXPECT_EQ(calls(), lines{});
     host.remove("client");
-    const auto result = replay({"unload", "accel"});
-    EXPECT_EQ(result.err, failed(conn_file, "child") + failed(unload_file, "success"));
-    EXPECT_EQ(result.out, "");
+    const std::string unopened = failed(unload_file, "success");
+    says({"unload", "accel"}, "", failed(conn_file, "child") + unopened);
     host.before_call(5, [&] { host.remove("NRXApp"); });
-    EXPECT_EQ(replay({"unload", "accel"}).err,
-              failed(conn_file, "service") + failed(unload_file, "success"));
+    says({"unload", "accel"}, "", failed(conn_file, "service") + unopened);
 }
 
 TEST_F(load_subcommand, events_are_deleted_however_a_subcommand_ends) {

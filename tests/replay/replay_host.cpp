@@ -49,6 +49,12 @@ outcome replay(const lines& words, int* taken) {
     return written;
 }
 
+void says(const lines& words, const std::string& out, const std::string& reports) {
+    const outcome written = replay(words);
+    EXPECT_EQ(written.out, out) << testing::PrintToString(words);
+    EXPECT_EQ(written.err, reports) << testing::PrintToString(words);
+}
+
 void replay_test::SetUp() {
     device_test::SetUp();
     app = &put_replay_services(host);
@@ -58,6 +64,12 @@ outcome replay_test::load(std::string_view text, lines further) {
     const sample_text_file file(text);
     further.insert(further.begin(), {"load", file.path()});
     return replay(further, &taken);
+}
+
+void replay_test::load_says(std::string_view text, const std::string& out,
+                            const std::string& reports) {
+    const sample_text_file file(text);
+    says({"load", file.path()}, out, reports);
 }
 
 void replay_test::answer_with(const byte_list& report) {

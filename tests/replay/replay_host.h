@@ -37,6 +37,9 @@ int run_replay(lines words);
 // The same, with what it wrote; how many further words it took, if asked.
 outcome replay(const lines& words, int* taken = nullptr);
 
+// Runs a subcommand that writes this on standard output and these failure reports.
+void says(const lines& words, const std::string& out, const std::string& reports = "");
+
 class replay_test : public device_test {
 protected:
     void SetUp() override;
@@ -45,6 +48,9 @@ protected:
     // it took.
     outcome load(std::string_view text, lines further = {});
     int taken = 0;
+
+    // The same, where this is written.
+    void load_says(std::string_view text, const std::string& out, const std::string& reports = "");
 
     // Lets the application answer with these states, and take any.
     void answer_with(const byte_list& report);

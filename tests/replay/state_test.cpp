@@ -24,12 +24,9 @@ const std::string usage =
 using replay_states = replay_test;
 
 TEST_F(replay_states, usage_is_the_answer_to_help_and_to_unknown_words) {
-    EXPECT_EQ(replay({"help", "ignored"}).out, usage);
-    for (const std::string word : {"", "Load", "loa", "load ", "loads", "status"}) {
-        const auto result = replay({word, "accel"});
-        EXPECT_EQ(result.out, "Invalid subcommand " + word + "\n\n" + usage);
-        EXPECT_EQ(result.err, "");
-    }
+    says({"help", "ignored"}, usage);
+    for (const std::string word : {"", "Load", "loa", "load ", "loads", "status"})
+        says({word, "accel"}, "Invalid subcommand " + word + "\n\n" + usage);
     EXPECT_TRUE(host.log().empty());
 }
 
@@ -56,16 +53,15 @@ TEST_F(replay_states, are_listed_with_names_where_there_are_any) {
     answer_with(words_of({0x13, 0x09090909, 0, 0x77, 0, 1, 0x10, 0, 2, 0x11, 0, 3, 0x3f9, 0, 0,
                           0xffffffff, 0, 0xffffffff}));
     put_service(host, "a long service name", 0x3f9);
-    const auto result = replay({"get-status"});
-    EXPECT_EQ(result.out,
-              "Replay status:\n"
-              "Service pressure   is inactive\n"
-              "Service 119        is loaded\n"
-              "Service accel      is enabled\n"
-              "Service gyro       is 3\n"
-              "Service a long service name is inactive\n"
-              "Service 4294967295 is 4294967295\n");
-    EXPECT_EQ(result.err, no_such_service + no_such_service);
+    says({"get-status"},
+         "Replay status:\n"
+         "Service pressure   is inactive\n"
+         "Service 119        is loaded\n"
+         "Service accel      is enabled\n"
+         "Service gyro       is 3\n"
+         "Service a long service name is inactive\n"
+         "Service 4294967295 is 4294967295\n",
+         no_such_service + no_such_service);
     EXPECT_EQ(calls(), lines(2, read_state));
 }
 
@@ -78,15 +74,11 @@ TEST_F(replay_states, every_subcommand_that_needs_replay_says_that_it_is_not_ena
                                                  {"disable", "accel"},
                                                  {"schedule-enable", "junk"},
                                                  {"get-status"}}) {
-        const auto result = replay(words);
-        EXPECT_EQ(result.out, "Replay is not enabled\n") << words[0];
-        EXPECT_EQ(result.err, "") << words[0];
+        says(words, "Replay is not enabled\n");
         EXPECT_EQ(calls(), lines{read_state}) << words[0];
     }
     host.remove("NRXApp");
-    const auto missing = replay({"get-status"});
-    EXPECT_EQ(missing.err, failed("base/channel.cpp", "service"));
-    EXPECT_EQ(missing.out, "Replay is not enabled\n");
+    says({"get-status"}, "Replay is not enabled\n", failed("base/channel.cpp", "service"));
 }
 
 TEST_F(replay_states, are_set_for_all_services_in_the_order_of_the_words) {
@@ -111,21 +103,20 @@ TEST_F(replay_states, are_set_for_all_services_in_the_order_of_the_words) {
 TEST_F(replay_states, words_that_are_missing_or_belong_to_no_service_send_nothing) {
     for (const lines& words :
          std::vector<lines>{{"enable"}, {"disable"}, {"schedule-enable"}, {"schedule-enable", "1"}})
-        EXPECT_EQ(replay(words).err, failed("replay/state_subcommands.cpp", "argc > optind"));
+        says(words, "", failed("replay/state_subcommands.cpp", "argc > optind"));
     const auto malformed = replay({"schedule-enable", "1s"});
     EXPECT_EQ(malformed.out, "invalid delay (1s)\n");
     EXPECT_EQ(malformed.status, 1);
-    const auto unknown = replay({"enable", "accel", "nobody", "nobody"});
-    EXPECT_EQ(unknown.err, no_such_service + failed("replay/replay_state.cpp", "success"));
-    EXPECT_EQ(unknown.out, "");
+    says({"enable", "accel", "nobody", "nobody"}, "",
+         no_such_service + failed("replay/replay_state.cpp", "success"));
     EXPECT_EQ(calls(), lines(6, read_state));
 }
 
 TEST_F(replay_states, what_the_application_refuses_is_reported_twice) {
     const std::string code = "not in a state for this (0xe0000405)";
-    EXPECT_EQ(replay({"enable", "accel"}).err,
-              failed("base/command_channel.cpp", "kr == 0 ", code) +
-                  failed("replay/replay_state.cpp", "kr == 0 ", code));
+    says({"enable", "accel"}, "",
+         failed("base/command_channel.cpp", "kr == 0 ", code) +
+             failed("replay/replay_state.cpp", "kr == 0 ", code));
 }
 
 }  // namespace tests
