@@ -103,25 +103,14 @@ protected:
     }
 };
 
-TEST_F(event_names, every_category_and_type) {
+TEST_F(event_names, every_value_of_every_identifier) {
     for (int id = 0; id < 256; ++id) {
         expect_names(id, 0, 0, 0);
         expect_names(id, 255, 255, id);
         expect_names(0, 0, 0, id);
-    }
-}
-
-TEST_F(event_names, every_component_of_every_category) {
-    for (int category = 0; category < 12; ++category) {
-        for (int id = 0; id < 256; ++id)
+        for (int category = 0; category < 12; ++category) {
             expect_names(category, id, 1, 3);
-    }
-}
-
-TEST_F(event_names, every_event_of_every_category_and_component) {
-    for (int category = 0; category < 12; ++category) {
-        for (const int component : {0, 1, 2, 3, 4, 5, 6, 7, 255}) {
-            for (int id = 0; id < 256; ++id)
+            for (const int component : {0, 1, 2, 3, 4, 5, 6, 7, 255})
                 expect_names(category, component, id, 3);
         }
     }
