@@ -11,7 +11,9 @@
 namespace {
 
 // As long as it lives, an interrupt stops the event loop; then the default action, which ends the
-// process, is back.
+// process, is back. An interrupt that comes when the loop of an option has ended already, but
+// before that, is a stop for later: a stop is never lost, so the next option that runs the loop
+// ends at once.
 class interrupt_stops_loop {
 public:
     interrupt_stops_loop() { platform::handle_interrupt(platform::stop_loop); }

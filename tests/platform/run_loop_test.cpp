@@ -179,11 +179,11 @@ TEST_F(event_loop, waits_for_the_times_when_it_follows_the_host) {
     host.clock().follow_host();
     const auto start = host.clock().now();
     first_records->script = {{start + 20ms, {1}}, {start + 1h, {2}}};
-    EXPECT_EQ(run_loop_for(40ms), platform::success);
-    EXPECT_GE(host.clock().now() - start, 40ms);
+    on_call = [](int) { stop_loop(); };
+    EXPECT_EQ(run_loop_for(10s), platform::success);
     ASSERT_EQ(called.size(), 1U);
     EXPECT_GE(called[0].second - start, 20ms);
-    EXPECT_LT(called[0].second - start, 40ms);
+    EXPECT_LT(called[0].second - start, 5s);
 }
 
 TEST_F(event_loop, every_run_can_be_made_to_fail) {

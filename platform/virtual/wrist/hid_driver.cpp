@@ -14,6 +14,7 @@ namespace platform::simulated {
 
 namespace {
 
+constexpr const char* device_class = "KeltoNRXHIDDevice";
 constexpr std::int32_t location = 1234;
 constexpr std::uint32_t client_type = 0x7a756d6f;  // "zumo"
 constexpr std::size_t request_size = 8;
@@ -51,13 +52,12 @@ private:
     // The driver's version, how many HID devices there are, how many usages one of them has.
     [[nodiscard]] return_code answer_to(std::uint32_t request, std::uint32_t about,
                                         std::uint64_t& value) const {
-        const auto& devices = device_.entries_of_class("KeltoNRXHIDDevice");
         switch (request) {
             case 0:
                 value = driver_version;
                 return success;
             case 1:
-                value = devices.size();
+                value = count_devices();
                 return success;
             case 2:
                 return usages_at(about, value);
@@ -66,10 +66,17 @@ private:
         }
     }
 
+    [[nodiscard]] std::uint64_t count_devices() const {
+        const auto& devices = device_.entries_of_class(device_class);
+        const auto is_there = [](const entry_ref& one) { return one->present; };
+        return static_cast<std::uint64_t>(std::count_if(devices.begin(), devices.end(), is_there));
+    }
+
     [[nodiscard]] return_code usages_at(std::uint32_t at, std::uint64_t& value) const {
         const property wanted(static_cast<std::int32_t>(at));
-        for (const entry_ref& one : device_.entries_of_class("KeltoNRXHIDDevice")) {
-            if (!same_value(*one->properties.find(location_id_key), wanted)) continue;
+        for (const entry_ref& one : device_.entries_of_class(device_class)) {
+            if (!one->present || !same_value(*one->properties.find(location_id_key), wanted))
+                continue;
             value = one->properties.find(usage_pairs_key)->items()->size();
             return success;
         }
