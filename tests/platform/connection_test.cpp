@@ -5,12 +5,10 @@
 
 #include "tests/support/device_test.h"
 
+namespace tests {
+
 namespace {
 
-using namespace tests;
-using platform::call_inputs;
-using platform::call_outputs;
-using platform::first_match;
 using platform::return_code;
 
 // A driver that opens type 3 too, gives back one scalar and three bytes by selector 0, and refuses
@@ -20,8 +18,8 @@ public:
     return_code open(std::uint32_t type) override {
         return type == 3 ? platform::success : driver::open(type);
     }
-    return_code call(std::uint32_t selector, const call_inputs& inputs,
-                     call_outputs& outputs) override {
+    return_code call(std::uint32_t selector, const platform::call_inputs& inputs,
+                     platform::call_outputs& outputs) override {
         if (selector != 0) return platform::bad_argument;
         outputs.scalars[0] = inputs.scalars[0] + 1;
         outputs.scalars = outputs.scalars.first(1);
@@ -31,21 +29,20 @@ public:
 
 class connection : public device_test {
 protected:
-    void SetUp() override {
-        device_test::SetUp();
+    connection() {
         host.add({.name = "echo", .unit = std::make_shared<echo_driver>()});
         host.add({.name = "bare"});
     }
 
     return_code open(std::string_view name, std::uint32_t type) {
-        return platform::open(first_match({{"IONameMatch", name}}), type, opened);
+        return platform::open(service_named(name), type, opened);
     }
-
     return_code call(std::uint32_t selector) {
         return platform::call(opened, selector, {.scalars = numbers_in, .structure = {}}, outputs);
     }
-
-    void expect_untouched_outputs() const {
+    // A call that fails leaves the outputs alone.
+    void expect_failure(std::uint32_t selector, return_code expected) {
+        EXPECT_EQ(call(selector), expected);
         EXPECT_EQ(outputs.scalars.size(), 2U);
         EXPECT_EQ(outputs.structure.size(), 8U);
     }
@@ -54,12 +51,7 @@ protected:
     std::array<std::uint64_t, 1> numbers_in{41};
     std::array<std::uint64_t, 2> numbers_out{};
     std::array<std::uint8_t, 8> bytes_out{};
-    call_outputs outputs{numbers_out, bytes_out};
-
-    void TearDown() override {
-        opened.reset();
-        device_test::TearDown();
-    }
+    platform::call_outputs outputs{numbers_out, bytes_out};
 };
 
 TEST_F(connection, opens_the_types_that_the_driver_knows_while_it_is_there) {
@@ -71,9 +63,7 @@ TEST_F(connection, opens_the_types_that_the_driver_knows_while_it_is_there) {
     EXPECT_EQ(open("echo", 1), platform::unsupported);
     EXPECT_EQ(open("bare", 0), platform::unsupported);
     EXPECT_EQ(open("absent", 0), platform::not_found);
-    host.fail_call(2, failure::nothing);
-    EXPECT_EQ(open("echo", 0), platform::success);
-    const platform::service echo = first_match({{"IONameMatch", "echo"}});
+    const platform::service echo = service_named("echo");
     host.remove("echo");
     EXPECT_EQ(platform::open(echo, 0, opened), platform::not_found);
     EXPECT_FALSE(opened);
@@ -90,20 +80,18 @@ TEST_F(connection, cuts_the_outputs_to_what_the_driver_returned) {
 }
 
 TEST_F(connection, leaves_the_outputs_alone_when_a_call_fails_and_may_succeed_with_nothing) {
-    EXPECT_EQ(call(0), platform::not_found);
-    expect_untouched_outputs();
+    expect_failure(0, platform::not_found);
     open("echo", 0);
-    EXPECT_EQ(call(1), platform::bad_argument);
-    expect_untouched_outputs();
+    expect_failure(1, platform::bad_argument);
     host.fail_call(1, failure::io);
-    EXPECT_EQ(call(0), platform::simulated::io_failure);
-    expect_untouched_outputs();
+    expect_failure(0, platform::simulated::io_failure);
     host.remove("echo");
-    EXPECT_EQ(call(0), platform::not_found);
-    expect_untouched_outputs();
+    expect_failure(0, platform::not_found);
     host.fail_call(1, failure::nothing);
     EXPECT_EQ(call(0), platform::success);
     EXPECT_TRUE(outputs.scalars.empty() && outputs.structure.empty());
 }
 
 }  // namespace
+
+}  // namespace tests

@@ -30,20 +30,13 @@ TEST_F(data_queue, answers_for_memory_and_notifications_of_the_types_that_the_dr
     EXPECT_EQ(platform::map_memory(connection, 0, other), platform::unsupported);
     EXPECT_FALSE(other);
     EXPECT_EQ(platform::attach_port(connection, 0, port, 0), platform::unsupported);
-    EXPECT_EQ(platform::attach_port(connection, 5, platform::notification_port(), 0),
-              platform::bad_argument);
-    EXPECT_EQ(platform::map_memory(platform::connection(), 3, other), platform::not_found);
-    EXPECT_EQ(platform::attach_port(platform::connection(), 5, port, 0), platform::not_found);
-}
-
-TEST_F(data_queue, counts_what_is_mapped_and_allocated_until_it_is_given_back) {
-    stream();
+    EXPECT_EQ(platform::attach_port(connection, 5, {}, 0), platform::bad_argument);
+    EXPECT_EQ(platform::map_memory({}, 3, other), platform::not_found);
+    EXPECT_EQ(platform::attach_port({}, 5, port, 0), platform::not_found);
     EXPECT_EQ(host.open_handles(), 3U);
     queue.reset();
-    EXPECT_EQ(host.open_handles(), 2U);
     port.reset();
     EXPECT_EQ(host.open_handles(), 1U);
-    EXPECT_EQ(logged("unmap"), std::vector<std::string>{"unmap streamer"});
 }
 
 TEST_F(data_queue, wait_lasts_until_the_driver_has_added_data) {
@@ -57,12 +50,9 @@ TEST_F(data_queue, wait_lasts_until_the_driver_has_added_data) {
 }
 
 TEST_F(data_queue, wait_needs_the_queue_and_the_port_that_is_signalled_for_it) {
-    auto& shared = stream();
-    shared.add({1});
-    const auto stranger = platform::allocate_port();
-    EXPECT_EQ(platform::wait_for_data(queue, stranger), platform::bad_argument);
-    EXPECT_EQ(platform::wait_for_data(queue, platform::notification_port()),
-              platform::bad_argument);
+    stream().add({1});
+    EXPECT_EQ(platform::wait_for_data(queue, platform::allocate_port()), platform::bad_argument);
+    EXPECT_EQ(platform::wait_for_data(queue, {}), platform::bad_argument);
     queue.reset();
     EXPECT_EQ(platform::wait_for_data(queue, port), platform::bad_argument);
     EXPECT_FALSE(platform::data_available(queue));
@@ -79,20 +69,6 @@ TEST_F(data_queue, wait_ends_when_the_driver_goes) {
     platform::mapped_memory other;
     EXPECT_EQ(platform::map_memory(connection, 3, other), platform::not_found);
     EXPECT_EQ(platform::attach_port(connection, 5, port, 0), platform::not_found);
-}
-
-TEST_F(data_queue, calls_can_be_made_to_fail_or_to_bring_nothing) {
-    stream().add({1});
-    host.fail_call(1, failure::io);
-    EXPECT_FALSE(platform::data_available(queue));
-    host.fail_call(1, failure::io);
-    EXPECT_EQ(take(1, platform::simulated::io_failure), bytes{0xee});
-    host.fail_call(1, failure::nothing);
-    EXPECT_EQ(take(1, platform::success), bytes{});
-    platform::mapped_memory other;
-    host.fail_call(1, failure::nothing);
-    EXPECT_EQ(platform::map_memory(connection, 3, other), platform::success);
-    EXPECT_FALSE(other);
 }
 
 }  // namespace tests

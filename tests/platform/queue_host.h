@@ -12,9 +12,6 @@ namespace tests {
 
 class queue_driver final : public platform::simulated::driver {
 public:
-    explicit queue_driver(std::shared_ptr<platform::simulated::shared_queue> shared)
-        : queue(std::move(shared)) {}
-
     platform::return_code call(std::uint32_t /*selector*/, const platform::call_inputs& /*inputs*/,
                                platform::call_outputs& /*outputs*/) override {
         return platform::unsupported;
@@ -26,39 +23,27 @@ public:
         return type == 5 ? queue : nullptr;
     }
 
-    std::shared_ptr<platform::simulated::shared_queue> queue;
+    std::shared_ptr<platform::simulated::shared_queue> queue =
+        std::make_shared<platform::simulated::shared_queue>();
 };
 
 // A queue, mapped and with a port attached to it, on a host of its own.
 class queue_test : public device_test {
 protected:
-    // A plain queue, streamed.
+    // Registers the driver of a plain queue as "streamer" and connects to it.
     platform::simulated::shared_queue& stream() {
-        const auto shared = std::make_shared<platform::simulated::shared_queue>();
-        stream(shared);
-        return *shared;
-    }
-
-    // Registers the driver of a queue as "streamer", which keeps it, and connects to it.
-    void stream(std::shared_ptr<platform::simulated::shared_queue> shared) {
-        host.add({.name = "streamer", .unit = std::make_shared<queue_driver>(std::move(shared))});
+        const auto driver = std::make_shared<queue_driver>();
+        host.add({.name = "streamer", .unit = driver});
         connect("streamer", 3, 5);
+        return *driver->queue;
     }
 
     // Connects to a driver and its queue.
     void connect(std::string_view name, std::uint32_t memory, std::uint32_t notification) {
-        const auto service = platform::first_match({{"IONameMatch", name}});
-        ASSERT_EQ(platform::open(service, 0, connection), platform::success);
+        ASSERT_EQ(platform::open(service_named(name), 0, connection), platform::success);
         ASSERT_EQ(platform::map_memory(connection, memory, queue), platform::success);
         port = platform::allocate_port();
         ASSERT_EQ(platform::attach_port(connection, notification, port, 0), platform::success);
-    }
-
-    void TearDown() override {
-        queue.reset();
-        port.reset();
-        connection.reset();
-        device_test::TearDown();
     }
 
     // The next entry; what the room held before, if there is none.

@@ -122,8 +122,4 @@ outcome profiler_test::profile(const std::string& words) {
     return written;
 }
 
-std::string failed(std::string_view file, std::string_view condition, std::string_view code) {
-    return failure_line("nrxtoollib", condition, "nrxctl/" + std::string(file), code);
-}
-
 }  // namespace tests

@@ -112,6 +112,5 @@ inline constexpr const char* conn_file = "profiler/profiler_conn.cpp";
 inline constexpr const char* grammar_file = "profiler/config_grammar.cpp";
 inline constexpr const char* kernel_file = "profiler/kernel_profiler.cpp";
 inline constexpr const char* monitor_file = "profiler/monitor.cpp";
-std::string failed(std::string_view file, std::string_view condition, std::string_view code = "");
 
 }  // namespace tests

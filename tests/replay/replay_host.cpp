@@ -92,8 +92,4 @@ lines replay_test::calls() {
     return made;
 }
 
-std::string failed(std::string_view file, std::string_view condition, std::string_view code) {
-    return failure_line("nrxtoollib", condition, "nrxctl/" + std::string(file), code);
-}
-
 }  // namespace tests

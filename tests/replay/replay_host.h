@@ -65,8 +65,7 @@ private:
     std::size_t seen_ = 0;
 };
 
-// Failure reports of the library, from a file of its folder.
-std::string failed(std::string_view file, std::string_view condition, std::string_view code = "");
+// The failure report of a service that is not there.
 inline const std::string no_such_service =
     failed("base/service_discovery.cpp", "service != ((io_object_t) 0)");
 

@@ -22,12 +22,27 @@ std::string failure_line(std::string_view label, std::string_view condition, std
     return line + "\n";
 }
 
+std::string failed(std::string_view file, std::string_view condition, std::string_view code) {
+    return failure_line("nrxtoollib", condition, "nrxctl/" + std::string(file), code);
+}
+
+std::string reported(platform::return_code expected,
+                     const std::function<platform::return_code()>& operation) {
+    const outcome result = capture([&] { EXPECT_EQ(operation(), expected); });
+    EXPECT_EQ(result.out, "");
+    return result.err;
+}
+
+platform::service service_named(std::string_view name) {
+    return platform::first_match({{"IONameMatch", name}});
+}
+
 std::vector<std::string> device_test::logged(std::string_view word) const {
-    std::vector<std::string> lines;
+    std::vector<std::string> found;
     std::copy_if(
-        host.log().begin(), host.log().end(), std::back_inserter(lines),
+        host.log().begin(), host.log().end(), std::back_inserter(found),
         [&](const std::string& line) { return line.starts_with(std::string(word) + " "); });
-    return lines;
+    return found;
 }
 
 }  // namespace tests

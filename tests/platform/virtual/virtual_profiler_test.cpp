@@ -1,7 +1,5 @@
 // The virtual profiler as the tool sees it: methods, requests, and the stream.
 
-#include <set>
-
 #include "platform/virtual/little_endian.h"
 #include "platform/virtual/profiler/profiler.h"
 #include "tests/platform/queue_host.h"
@@ -10,7 +8,6 @@ namespace tests {
 
 using namespace std::chrono_literals;
 using platform::simulated::component_config;
-using platform::simulated::event_stream;
 using platform::simulated::get_u32;
 
 namespace {
@@ -40,17 +37,12 @@ component_config enabled(std::uint32_t category, std::uint32_t component,
 
 class virtual_profiler : public queue_test {
 protected:
-    void SetUp() override {
-        queue_test::SetUp();
+    virtual_profiler() {
         const auto shared = add_profiler_driver(host);
         serve_profile(put_service(host, "profile", 1), shared);
         shared->stream()->set_rate(1000);
         connect("KeltoNRXProfileDriver", 0, 0);
-        platform::open(platform::first_match({{"IONameMatch", "profile"}}), 0, coprocessor);
-    }
-    void TearDown() override {
-        coprocessor.reset();
-        queue_test::TearDown();
+        platform::open(service_named("profile"), 0, coprocessor);
     }
 
     using number_list = std::vector<std::uint64_t>;
@@ -135,29 +127,21 @@ TEST_F(virtual_profiler, refuses_what_a_driver_would_refuse_and_does_the_rest) {
 }
 
 TEST_F(virtual_profiler, stream_comes_at_its_rate_in_batches_with_coherent_numbers_and_times) {
-    configure_coprocessor({enabled(2, 0, 4), enabled(3, 0, 1)});
+    configure_coprocessor({enabled(2, 5, 0x10000), enabled(4, 0, 2)});
     enable(true);
     for (unsigned batch = 1; batch <= 3; ++batch) {
         const auto events = receive();
         EXPECT_EQ(host.clock().now(), batch * 20ms);
         ASSERT_EQ(events.size(), 20U);
         for (std::size_t i = 0; i < events.size(); ++i) {
-            EXPECT_EQ(events[i].category, i % 2 == 0 ? 2U : 3U);
+            EXPECT_EQ(events[i].category, i % 2 == 0 ? 2U : 4U);
+            EXPECT_EQ(events[i].number, i % 2 == 0 ? 16U : 1U);
             EXPECT_EQ(events[i].time, (batch - 1) * 20000U + (i + 1) * 1000U);
             EXPECT_EQ(events[i].sequence, events[0].sequence + i);
         }
     }
     enable(false);
     expect_no_end_of_waiting();
-}
-
-TEST_F(virtual_profiler, stream_holds_what_the_masks_say) {
-    configure_coprocessor({enabled(2, 5, 0x10001), enabled(4, 0, 2), enabled(1, 0, 0x80000000)});
-    enable(true);
-    std::set<std::pair<unsigned, unsigned>> seen;
-    for (const event& one : receive())
-        seen.emplace(one.category, one.number);
-    EXPECT_EQ(seen, (std::set<std::pair<unsigned, unsigned>>{{2, 0}, {2, 16}, {4, 1}}));
 }
 
 TEST_F(virtual_profiler, stream_ends_when_asked_and_begins_anew_once_the_queue_is_let_go) {
@@ -199,58 +183,44 @@ TEST_F(virtual_profiler, flush_hands_over_what_has_happened_before_the_batch_is_
     EXPECT_FALSE(platform::data_available(queue));
     EXPECT_EQ(call(coprocessor, 3, {0x23}).code, platform::success);
     EXPECT_EQ(receive().size(), 7U);
-    EXPECT_EQ(receive().size(), 13U);
     // A full queue loses the oldest.
     host.clock().pass(3600s);
     const auto events = receive();
-    EXPECT_EQ(events.size(), event_stream::capacity);
+    EXPECT_EQ(events.size(), platform::simulated::event_stream::capacity);
     EXPECT_EQ(events.back().time, 3'600'000'000U);
 }
 
 TEST_F(virtual_profiler, logs_and_dump_hold_what_was_done_and_are_emptied_by_reading) {
-    const auto kernel_log = [&] { return call(kernel, 9, {}, {}, 95).bytes; };
     const auto coprocessor_log = [&] { return call(coprocessor, 2, {0xd1}, {}, 65536).bytes; };
-    const auto error_dump = [&] { return call(kernel, 8, {}, {}, 48000).bytes; };
-    kernel_log();
+    const auto error_dump = [&] { return call(kernel, 8, {}, {}, 48000).bytes.size(); };
     coprocessor_log();
     configure_coprocessor({enabled(0, 0)});
-    enable(true);
     set_duration(9000);
-    const byte_list notes = coprocessor_log();
-    ASSERT_EQ(notes.size(), 96U);
-    EXPECT_EQ(notes[48 + 1], 6U);
-    EXPECT_EQ(get_u32(notes, 48 + 16), 9000U);
-    EXPECT_TRUE(coprocessor_log().empty());
-    enable(false);
-    for (const std::size_t size : {48U, 48U, 0U})
-        EXPECT_EQ(kernel_log().size(), size);
-
-    EXPECT_TRUE(error_dump().empty());
     set_duration(0);
     enable(true);
+    const byte_list notes = coprocessor_log();
+    ASSERT_EQ(notes.size(), 3U * 48U);
+    EXPECT_EQ(get_u32(notes, 48 + 16), 9000U);
+    EXPECT_TRUE(coprocessor_log().empty());
+    // Room for one record of those that the start and the enabling have left.
+    EXPECT_EQ(call(kernel, 9, {}, {}, 95).bytes.size(), 48U);
     receive();
     receive();
+    EXPECT_EQ(error_dump(), 0U);
     EXPECT_EQ(call(kernel, 10, {}).code, platform::success);
-    const byte_list dump = error_dump();
-    ASSERT_EQ(dump.size(), 33U * 48U);
-    EXPECT_EQ(read_event({dump.end() - 96, dump.end() - 48}).time, 40000U);
-    EXPECT_EQ(dump[32 * 48 + 3], 8U);
+    EXPECT_EQ(error_dump(), 33U * 48U);
+    EXPECT_EQ(error_dump(), 0U);
 }
 
 TEST_F(virtual_profiler, statistics_move_and_can_be_cleared) {
     const auto count = [&] {
         return get_u32(call(coprocessor, 3, {0x20}, {0, 0, 0, 0, 1, 0, 0, 0}, 12800).bytes, 48);
     };
-    const auto wakes = [&] {
-        return get_u32(call(coprocessor, 3, {0x20}, {10, 0, 0, 0, 0, 0, 0, 0}, 108).bytes, 4);
-    };
-    EXPECT_EQ(count() + wakes(), 0U);
+    EXPECT_EQ(count(), 0U);
     host.clock().pass(60s);
     EXPECT_EQ(count(), 1200U);
-    EXPECT_EQ(wakes(), 15U);
     EXPECT_EQ(call(coprocessor, 3, {0x20}, byte_list(8)).code, platform::success);
     EXPECT_EQ(count(), 0U);
-    EXPECT_EQ(wakes(), 15U);
 }
 
 }  // namespace tests
