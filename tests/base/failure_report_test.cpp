@@ -1,6 +1,5 @@
 #include "nrxctl/base/failure_report.h"
 
-#include <functional>
 #include <string>
 #include <vector>
 
@@ -12,13 +11,12 @@
 namespace {
 
 using namespace tests;
-using nrx::report_failure;
 
 std::string reported(const char* label, const char* condition, const char* exit_label,
                      const char* message, const char* file, int line, std::uint32_t code) {
     const auto result = capture([&] {
-        report_failure(label, condition, exit_label, message, file, line,
-                       platform::code_from_bits(code));
+        nrx::report_failure(label, condition, exit_label, message, file, line,
+                            platform::code_from_bits(code));
     });
     EXPECT_EQ(result.out, "");
     return result.err;
@@ -56,33 +54,26 @@ TEST(failure_report, ends_with_the_text_of_the_code_and_its_32_bit_pattern) {
     }
 }
 
-TEST(check, answers_whether_it_holds) {
+TEST(check, answers_whether_it_holds_and_names_the_line_where_it_stands) {
+    const std::vector<std::uint8_t> short_reply(1);
     const auto held = capture([] {
         EXPECT_TRUE(nrx::check(true, "service"));
         EXPECT_TRUE(nrx::check_success(platform::success, "kr == 0 "));
     });
     EXPECT_EQ(held.err, "");
-    const auto failed = capture([] {
+    const int line = __LINE__;
+    const auto failed = capture([&] {
         EXPECT_FALSE(nrx::check(nullptr, "child"));
         EXPECT_FALSE(nrx::check_success(platform::no_memory, "result == 0 "));
+        nrx::check_length(short_reply, 2);
     });
-    EXPECT_EQ(failed.err,
-              "Assertion failed: nrxtoollib: Check failed: child bail "
-              "tests/base/failure_report_test.cpp\n"
-              "Assertion failed: nrxtoollib: Check failed: result == 0  bail "
-              "tests/base/failure_report_test.cpp out of memory (0xe00002bd)\n");
-}
-
-TEST(check, names_the_line_where_it_stands) {
-    const auto place_of = [](const std::function<void()>& failing) {
-        const std::string text = capture(failing).err_as_written;
-        const std::string file = "tests/base/failure_report_test.cpp:";
-        return std::stoi(text.substr(text.find(file) + file.size()));
+    const auto place = [&](int below) {
+        return " bail tests/base/failure_report_test.cpp:" + std::to_string(line + below);
     };
-    const std::vector<std::uint8_t> short_reply(1);
-    EXPECT_EQ(place_of([] { nrx::check(false, "child"); }), __LINE__);
-    EXPECT_EQ(place_of([] { nrx::check_success(5, "kr == 0 "); }), __LINE__);
-    EXPECT_EQ(place_of([&] { nrx::check_length(short_reply, 2); }), __LINE__);
+    const std::string begin = "Assertion failed: nrxtoollib: Check failed: ";
+    EXPECT_EQ(failed.err_as_written, begin + "child" + place(2) + "\n" + begin + "result == 0 " +
+                                         place(3) + " out of memory (0xe00002bd)\n" + begin +
+                                         "length >= 2" + place(4) + "\n");
 }
 
 }  // namespace

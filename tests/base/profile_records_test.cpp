@@ -2,9 +2,9 @@
 
 #include "tests/support/device_test.h"
 
-namespace {
+namespace tests {
 
-using namespace tests;
+namespace {
 
 std::vector<nrx::profile_record> handed_on;
 
@@ -52,3 +52,5 @@ TEST_F(profile_records, stops_after_ten_reads) {
 }
 
 }  // namespace
+
+}  // namespace tests

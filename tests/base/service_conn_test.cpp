@@ -2,9 +2,11 @@
 
 #include "tests/support/device_test.h"
 
+namespace tests {
+
 namespace {
 
-using namespace tests;
+constexpr const char* file = "base/service_conn.cpp";
 
 class service_conn : public device_test {
 protected:
@@ -21,9 +23,6 @@ protected:
                    EXPECT_EQ(host.open_handles(), held);
                })
             .err;
-    }
-    static std::string failed(std::string_view condition, std::string_view code = "") {
-        return failure_line("nrxtoollib", condition, "nrxctl/base/service_conn.cpp", code);
     }
 };
 
@@ -44,16 +43,18 @@ TEST_F(service_conn, opens_the_first_child_of_a_service_of_any_class_and_gives_a
 
 TEST_F(service_conn, reports_what_fails_and_is_quiet_only_about_a_missing_service) {
     host.add({.name = "WQR_NRXApp"});
-    EXPECT_EQ(failing(false, 0), failed("service"));
+    EXPECT_EQ(failing(false, 0), failed(file, "service"));
     EXPECT_EQ(failing(true, 0), "");
     host.add({.name = "NRXApp"});
-    EXPECT_EQ(failing(true, 1), failed("child"));
+    EXPECT_EQ(failing(true, 1), failed(file, "child"));
     host.remove("NRXApp");
     put_app();
     host.fail_call(3, failure::no_memory);
-    EXPECT_EQ(failing(true, 2), failed("kr == 0 ", no_memory_text));
+    EXPECT_EQ(failing(true, 2), failed(file, "kr == 0 ", no_memory_text));
     host.fail_call(3, failure::nothing);
-    EXPECT_EQ(failing(false, 2), failed("connect"));
+    EXPECT_EQ(failing(false, 2), failed(file, "connect"));
 }
 
 }  // namespace
+
+}  // namespace tests

@@ -3,13 +3,11 @@
 #include "nrxctl/base/matching.h"
 #include "tests/support/device_test.h"
 
+namespace tests {
+
 namespace {
 
-using namespace tests;
-
-std::string failed(std::string_view condition, std::string_view code = "") {
-    return failure_line("nrxtoollib", condition, "nrxctl/base/service_discovery.cpp", code);
-}
+constexpr const char* file = "base/service_discovery.cpp";
 
 class service_discovery : public device_test {
 protected:
@@ -60,7 +58,7 @@ TEST_F(service_discovery, prefers_the_prefixed_name_and_cuts_it_alone_at_127_cha
     EXPECT_EQ(host.log().back(), asked(name));
 }
 
-TEST_F(service_discovery, an_id_that_is_none_finds_nothing) {
+TEST_F(service_discovery, an_id_that_is_none_finds_nothing_and_what_is_not_found_is_said) {
     put_service(host, "zero", 0);
     for (const char* name :
          {"", "0x", "0xzz", "0x1z", "2147483648", "0xffffffff", "99999999999999999999", "0x-1"}) {
@@ -69,25 +67,20 @@ TEST_F(service_discovery, an_id_that_is_none_finds_nothing) {
             EXPECT_EQ(found(name), "") << name;
             EXPECT_FALSE(nrx::find_hid_device(name)) << name;
             EXPECT_FALSE(nrx::resolve_service_id(name, id)) << name;
+            EXPECT_FALSE(nrx::service_exists(name));
+            EXPECT_TRUE(nrx::service_exists("zero"));
         });
+        EXPECT_EQ(result.out, "Service " + std::string(name) + " can't be found\n");
         EXPECT_EQ(result.err, "") << name;
         EXPECT_EQ(id, 77);
     }
-}
-
-TEST_F(service_discovery, says_when_a_service_does_not_exist) {
-    put_service(host, "accel", 31);
-    EXPECT_EQ(capture([] { EXPECT_TRUE(nrx::service_exists("accel")); }).out, "");
-    const auto result = capture([] { EXPECT_FALSE(nrx::service_exists("nope")); });
-    EXPECT_EQ(result.out, "Service nope can't be found\n");
-    EXPECT_EQ(result.err, "");
 }
 
 TEST_F(service_discovery, finds_the_hid_device_at_the_service_id) {
     put_hid_device("zero", 0);
     put_hid_device("button", 9);
     EXPECT_EQ(capture([] { EXPECT_FALSE(nrx::find_hid_device("button")); }).err,
-              failed("nrx_interface"));
+              failed(file, "nrx_interface"));
     put_service(host, "WQR_button", 9);
     for (const char* name : {"button", "9", "0x9"})
         EXPECT_EQ(name_of(nrx::find_hid_device(name)), "button") << name;
@@ -113,7 +106,7 @@ TEST_F(service_discovery, resolves_numbers_without_asking_and_names_by_their_ser
     EXPECT_TRUE(nrx::resolve_service_id("accel", id));
     EXPECT_EQ(id, -4);
     EXPECT_EQ(capture([&] { EXPECT_FALSE(nrx::resolve_service_id("nope", id)); }).err,
-              failed("service != ((io_object_t) 0)"));
+              failed(file, "service != ((io_object_t) 0)"));
 }
 
 TEST_F(service_discovery, names_the_service_of_an_id) {
@@ -125,10 +118,10 @@ TEST_F(service_discovery, names_the_service_of_an_id) {
     EXPECT_TRUE(nrx::service_name_for_id(-4, name));
     EXPECT_EQ(name, "below");
     EXPECT_EQ(capture([&] { EXPECT_FALSE(nrx::service_name_for_id(5, name)); }).err,
-              failed("service != ((io_object_t) 0)"));
+              failed(file, "service != ((io_object_t) 0)"));
     host.fail_call(2, failure::io);
     EXPECT_EQ(capture([&] { EXPECT_FALSE(nrx::service_name_for_id(31, name)); }).err,
-              failed("kr == 0 ", io_text));
+              failed(file, "kr == 0 ", io_text));
     EXPECT_EQ(name, "below");
 }
 
@@ -140,3 +133,5 @@ TEST(matching, builds_what_the_lookups_are_made_with) {
 }
 
 }  // namespace
+
+}  // namespace tests

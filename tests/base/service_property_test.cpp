@@ -1,38 +1,25 @@
 #include "nrxctl/base/service_property.h"
 
-#include "nrxctl/base/service_discovery.h"
 #include "tests/support/device_test.h"
+
+namespace tests {
 
 namespace {
 
-using namespace tests;
+constexpr const char* file = "base/service_property.cpp";
 
 class service_property : public device_test {
 protected:
-    void SetUp() override {
-        device_test::SetUp();
-        put_service(host, "accel", 31);
-        service = nrx::find_service("accel");
-    }
-    void TearDown() override {
-        service.reset();
-        device_test::TearDown();
-    }
-
-    static std::string failed(std::string_view condition, std::string_view code = "") {
-        return failure_line("nrxtoollib", condition, "nrxctl/base/service_property.cpp", code);
-    }
-
-    platform::service service;
+    interface_driver& accel = put_service(host, "accel", 31);
+    platform::service service = service_named("accel");
 };
 
 TEST_F(service_property, reads_back_what_was_set) {
     const platform::property value(platform::array{1, "two", platform::dictionary{{"k", 3}}});
     EXPECT_EQ(nrx::set_service_property(service, "ReportRates", &value), platform::success);
-    const auto result = capture(
-        [&] { EXPECT_EQ(nrx::show_service_property(service, "ReportRates"), platform::success); });
-    EXPECT_EQ(result.out, "");
-    EXPECT_EQ(result.err, "(1, \"two\", {k = 3})\n");
+    EXPECT_EQ(reported(platform::success,
+                       [&] { return nrx::show_service_property(service, "ReportRates"); }),
+              "(1, \"two\", {k = 3})\n");
 }
 
 TEST_F(service_property, reports_what_is_missing_or_refused) {
@@ -42,11 +29,13 @@ TEST_F(service_property, reports_what_is_missing_or_refused) {
         EXPECT_EQ(nrx::set_service_property(service, "x", nullptr), platform::bad_argument);
         EXPECT_EQ(nrx::show_service_property(service, nullptr), platform::success);
         EXPECT_EQ(nrx::show_service_property(service, "x"), platform::success);
-        host.fail_call(1, tests::failure::unsupported);
+        host.fail_call(1, failure::unsupported);
         EXPECT_EQ(nrx::set_service_property(service, "x", &value), platform::unsupported);
     });
-    EXPECT_EQ(result.err, failed("propertyName") + failed("property") + failed("propertyName") +
-                              failed("property") + failed("kr == 0 ", unsupported_text));
+    const std::string missing = failed(file, "propertyName") + failed(file, "property");
+    EXPECT_EQ(result.err, missing + missing + failed(file, "kr == 0 ", unsupported_text));
 }
 
 }  // namespace
+
+}  // namespace tests

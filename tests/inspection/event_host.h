@@ -21,10 +21,7 @@ std::string printed_event(const platform::hid_event& event, const std::string& l
 
 class event_test : public device_test {
 protected:
-    void SetUp() override {
-        device_test::SetUp();
-        forget_events();
-    }
+    event_test() { forget_events(); }
 };
 
 }  // namespace tests

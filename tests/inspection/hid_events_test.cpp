@@ -17,7 +17,7 @@ using platform::hid_event;
 
 const std::string marker = "<-------------------------------";
 
-class hid_events : public event_test {};
+using hid_events = event_test;
 
 hid_event acceleration_at(double time) {
     auto event = event_at(time, platform::accelerometer_event);
@@ -28,6 +28,9 @@ hid_event acceleration_at(double time) {
 }
 
 TEST_F(hid_events, null_events_tell_their_times_in_the_streams_own_format) {
+    EXPECT_EQ(printed_event(hid_event{.ticks = 1ULL << 63, .type = platform::null_event}),
+              "[null] 0 ∂=9.22337e+12 latency: 0\n");
+    forget_events();
     auto event = event_at(1234.5678, platform::null_event);
     event.latency_nanoseconds = 84'999;
     EXPECT_EQ(printed_event(event), "[null] 0 ∂=1234.57 latency: 8.4e-05\n");
@@ -136,8 +139,6 @@ TEST_F(hid_events, vendor_data_are_text_up_to_the_first_nul) {
 
 TEST_F(hid_events, vendor_events_switch_the_format_of_statistics_and_others_too) {
     const byte_list pushed{0, 6, 57, 0, 0x80, 1, 0};
-    EXPECT_EQ(capture([&] { nrx::stats_callback(pushed); }).out,
-              "TALY_CALLBACK: push com.kelto.wqr.test 1.5\n");
     printed_event(vendor_event_at(1, "a"));
     EXPECT_EQ(capture([&] { nrx::stats_callback(pushed); }).out,
               "TALY_CALLBACK: push com.kelto.wqr.test 1.500000\n");

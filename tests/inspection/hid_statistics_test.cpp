@@ -8,7 +8,7 @@ namespace tests {
 
 namespace {
 
-class hid_statistics : public event_test {};
+using hid_statistics = event_test;
 
 byte_list record(std::uint8_t operation, std::uint8_t key, std::int32_t value) {
     const auto bits = static_cast<std::uint32_t>(value);
@@ -67,30 +67,19 @@ TEST_F(hid_statistics, only_whole_records_are_printed_whatever_the_length) {
 
 TEST_F(hid_statistics, keys_have_the_vendors_domain_in_front_and_unknown_ones_a_question_mark) {
     std::istringstream names(R"(
-com.kelto.wqr.button.click.count
-com.kelto.wqr.button.single_click.count
-com.kelto.wqr.button.double_click.count
-com.kelto.wqr.button.triple_click.count
-com.kelto.wqr.button.long_press.count
-com.kelto.wqr.button.touch_with_click.count
-com.kelto.wqr.button.touch_no_click.count
-com.kelto.wqr.button.click.vesk
-com.kelto.wqr.button.touch.vesk
-com.kelto.wqr.button.click_to_vesk.time
-com.kelto.wqr.button.touch_to_vesk.time
-com.kelto.wqr.button.click.duration
-com.kelto.wqr.button.touch.duration
-com.kelto.wqr.button.touch_to_first_click.time
+com.kelto.wqr.button.click.count com.kelto.wqr.button.single_click.count
+com.kelto.wqr.button.double_click.count com.kelto.wqr.button.triple_click.count
+com.kelto.wqr.button.long_press.count com.kelto.wqr.button.touch_with_click.count
+com.kelto.wqr.button.touch_no_click.count com.kelto.wqr.button.click.vesk
+com.kelto.wqr.button.touch.vesk com.kelto.wqr.button.click_to_vesk.time
+com.kelto.wqr.button.touch_to_vesk.time com.kelto.wqr.button.click.duration
+com.kelto.wqr.button.touch.duration com.kelto.wqr.button.touch_to_first_click.time
 com.kelto.wqr.button.touch_to_last_unclick.time
 com.kelto.wqr.button.first_click_to_last_unclick.time
-com.kelto.wqr.button.first_click_to_untouch.time
-com.kelto.wqr.button.last_unclick_to_untouch.time
-com.kelto.wqr.button.critical_error.count
-com.kelto.wqr.button.timeout.count
-com.kelto.wqr.prox.event.ext_bl_capture.count
-com.kelto.wqr.prox.event.smudge_timeout.bh.count
-com.kelto.wqr.prox.event.smudge_timeout.nonbh.count
-com.kelto.wqr.prox.event.high_amb.count
+com.kelto.wqr.button.first_click_to_untouch.time com.kelto.wqr.button.last_unclick_to_untouch.time
+com.kelto.wqr.button.critical_error.count com.kelto.wqr.button.timeout.count
+com.kelto.wqr.prox.event.ext_bl_capture.count com.kelto.wqr.prox.event.smudge_timeout.bh.count
+com.kelto.wqr.prox.event.smudge_timeout.nonbh.count com.kelto.wqr.prox.event.high_amb.count
 com.kelto.wqr.prox.first_pocket_signal_sample.kcpss
 com.kelto.com.wqr.prox.baseline_to_trigger.time.dist
 com.kelto.wqr.prox.ext_bl_capture.signal_delta.dist
@@ -102,34 +91,20 @@ com.kelto.wqr.prox.num_bias_corrected_frames_for_high_ambient_baseline_capture_t
 com.kelto.wqr.button.touch_with_click.ap_on.duration
 com.kelto.wqr.button.touch_with_no_click.ap_on.duration
 com.kelto.wqr.button.touch_with_click.ap_off.duration
-com.kelto.wqr.button.touch_with_no_click.ap_off.duration
-com.kelto.wqr.button.touch.ap_on.duration
-com.kelto.wqr.button.touch.ap_off.duration
-com.kelto.wqr.zarn.reset_hb_count
-com.kelto.wqr.zarn.reset_count
-com.kelto.wqr.zarn.ibfd_timeout_count
-com.kelto.wqr.tactkey.reset_timeout_count
-com.kelto.wqr.button.wendra.cl_timeout.count
-com.kelto.wqr.button.wendra.cl_fault.count
-com.kelto.wqr.button.zarn_probe_failure_zarn_count
-com.kelto.wqr.button.force_sensor_probe_failure_count
-com.kelto.wqr.button.arc_probe_failure_count
-com.kelto.wqr.button.btmspk_probe_failure_count
-?
-?
-com.kelto.wqr.audio.arc.on.duration
-com.kelto.wqr.audio.arc.off.duration
-com.kelto.wqr.audio.arc.prewarm.duration
-com.kelto.wqr.audio.btmspk.on.duration
-com.kelto.wqr.audio.btmspk.off.duration
-com.kelto.wqr.audio.btmspk.prewarm.duration
-?
-com.kelto.wqr.test
+com.kelto.wqr.button.touch_with_no_click.ap_off.duration com.kelto.wqr.button.touch.ap_on.duration
+com.kelto.wqr.button.touch.ap_off.duration com.kelto.wqr.zarn.reset_hb_count
+com.kelto.wqr.zarn.reset_count com.kelto.wqr.zarn.ibfd_timeout_count
+com.kelto.wqr.tactkey.reset_timeout_count com.kelto.wqr.button.wendra.cl_timeout.count
+com.kelto.wqr.button.wendra.cl_fault.count com.kelto.wqr.button.zarn_probe_failure_zarn_count
+com.kelto.wqr.button.force_sensor_probe_failure_count com.kelto.wqr.button.arc_probe_failure_count
+com.kelto.wqr.button.btmspk_probe_failure_count ? ? com.kelto.wqr.audio.arc.on.duration
+com.kelto.wqr.audio.arc.off.duration com.kelto.wqr.audio.arc.prewarm.duration
+com.kelto.wqr.audio.btmspk.on.duration com.kelto.wqr.audio.btmspk.off.duration
+com.kelto.wqr.audio.btmspk.prewarm.duration ? com.kelto.wqr.test
 )");
     std::string name;
-    std::getline(names, name);
     for (int key = 0; key < 256; ++key) {
-        if (!std::getline(names, name)) name = "?";
+        if (!(names >> name)) name = "?";
         EXPECT_EQ(printed(record(0, static_cast<std::uint8_t>(key), 0)),
                   "TALY_CALLBACK: NOP" + name + "\n")
             << key;

@@ -25,7 +25,7 @@ std::string diagnostics_until(const std::string& report) {
     return all.substr(0, all.find(banner) + banner.size());
 }
 
-std::string failed(std::string_view condition, std::string_view code = "") {
+std::string dump_failed(std::string_view condition, std::string_view code = "") {
     return failure_line("keyprobe", condition, "keyprobe/hid_feature_reports.cpp", code);
 }
 
@@ -109,16 +109,16 @@ TEST_F(collection, a_report_that_does_not_fit_is_refused_not_cut) {
 
 TEST_F(collection, of_feature_reports_needs_a_device_with_that_usage_that_can_be_opened) {
     host.fail_call(2, failure::nothing);
-    expect_feature_reports("", failed("device"));
+    expect_feature_reports("", dump_failed("device"));
     host.fail_call(3, failure::io);
-    expect_feature_reports("", failed("result == 0 ", io_text));
+    expect_feature_reports("", dump_failed("result == 0 ", io_text));
     EXPECT_EQ(logged("close").size(), 1U);
     host.remove("button-hid");
     const platform::dictionary usage{{"DeviceUsagePage", 0xFF00}, {"DeviceUsage", 0x21}};
     host.add({.name = "other",
               .classes = {"IOHIDDevice"},
               .properties = {{"DeviceUsagePairs", platform::array{usage}}}});
-    expect_feature_reports("", failed("service"));
+    expect_feature_reports("", dump_failed("service"));
     EXPECT_EQ(host.log().back(),
               "first match {DeviceUsagePairs = ({DeviceUsagePage = 65280; DeviceUsage = 32}); "
               "IOProviderClass = \"IOHIDDevice\"}");
@@ -132,7 +132,7 @@ TEST_F(collection, of_feature_reports_stops_at_the_first_that_fails_and_closes_t
         "00000000: 71 71 71 71 71 71 71 71  71 71 71 71 71 71 71 71  | qqqqqqqq qqqqqqqq\n"
         "00000010: 71 71 71 71                                       | qqqq\n"
         "==============hidreport get 0xb4 -u 0xFF00,0x0020===============\n",
-        failed("result == 0 ", unsupported_text));
+        dump_failed("result == 0 ", unsupported_text));
     EXPECT_EQ(std::vector<std::string>(host.log().end() - 3, host.log().end()),
               (std::vector<std::string>{"close hid device button-hid",
                                         "release hid device button-hid", "release button-hid"}));

@@ -150,6 +150,7 @@ TEST(config_grammar, words_that_fail_are_reported_and_keep_what_came_before) {
              {"exec::all", "", failed(grammar_file, "components.size() == 1")},
              {"exec:3", "", unknown_component},
              {"sensor:7", "", unknown_component},
+             {"sensor:stops", "", unknown_component},
              {"sensor:gyro,all,accel", "2.1 0 ffff", unknown_component},
              {"sensor:gyro,,accel", "2.1 0 ffff", unknown_component},
              {"trace:endpoint:all:1,2,3,4,5,6,7,8,9", "", too_many_services},
@@ -165,10 +166,12 @@ TEST(config_grammar, words_that_fail_are_reported_and_keep_what_came_before) {
 TEST(config_grammar, words_that_are_no_numbers_of_32_bits_end_the_process) {
     const rows<std::string, std::string> cases{
         {"trace:bogus", "component is invalid (bogus)\n"},
+        {"trace:sto", "component is invalid (sto)\n"},
         {"trace:,endpoint:all", "component is invalid ()\n"},
         {"trace:-1", "component is invalid (-1)\n"},
         {"scm:0x100000000", "component is invalid (0x100000000)\n"},
         {"sensor:accel:latt", "report mask is invalid (latt)\n"},
+        {"sensor:accel:stopped", "report mask is invalid (stopped)\n"},
         {"sensor:accel:lat,,raw", "report mask is invalid ()\n"},
         {"sensor:accel:-4", "report mask is invalid (-4)\n"},
         {"wake:wake:4294967296", "report mask is invalid (4294967296)\n"},
