@@ -88,11 +88,12 @@ TEST_F(virtual_replay, refuses_a_request_that_is_cut_or_has_words_out_of_range) 
         EXPECT_EQ(load(request), code) << index << " " << value;
     }
     byte_list cut = bytes_of(axis_request);
-    for (cut.pop_back(); !cut.empty(); cut.pop_back()) {
-        // With a byte count that fits.
-        if (cut.size() >= 20) cut[16] = static_cast<std::uint8_t>(cut.size() - 20);
-        EXPECT_EQ(client_call(0, cut), bad_argument) << cut.size();
-    }
+    cut.pop_back();
+    EXPECT_EQ(client_call(0, cut), bad_argument);
+    cut[16] -= 1;
+    EXPECT_EQ(client_call(0, cut), bad_argument);
+    cut.resize(19);
+    EXPECT_EQ(client_call(0, cut), bad_argument);
     expect_states({7, 0, 0, 9, 0, 0});
 }
 
