@@ -6,7 +6,7 @@
 #include "nrxctl/base/hid_driver.h"
 #include "nrxctl/base/named_property.h"
 #include "nrxctl/base/scalar_method.h"
-#include "tests/support/device_test.h"
+#include "tests/base/base_host.h"
 
 namespace tests {
 
@@ -14,20 +14,6 @@ namespace {
 
 using platform::return_code;
 using lines = std::vector<std::string>;
-
-// Answers with its input, reversed, and one byte more.
-class mirror final : public platform::simulated::driver {
-public:
-    return_code open(std::uint32_t type) override {
-        return type == 0x7a756d6f ? platform::success : platform::unsupported;
-    }
-    return_code call(std::uint32_t /*selector*/, const platform::call_inputs& inputs,
-                     platform::call_outputs& outputs) override {
-        byte_list reply(inputs.structure.rbegin(), inputs.structure.rend());
-        reply.push_back(0xff);
-        return platform::simulated::answer(reply, outputs);
-    }
-};
 
 struct operation {
     const char* file;
@@ -39,18 +25,9 @@ struct operation {
 class channel_operations : public device_test {
 protected:
     channel_operations() {
-        accel.set_report(0xd0, {1, 2, 3});
-        accel.set_command(0x20, [](platform::byte_view, byte_list& reply) {
-            reply = {9, 8};
-            return platform::success;
-        });
-        accel.set_scalar_method([](std::span<const std::uint64_t>) { return platform::success; });
-        accel.set_named_property("gain", {4, 5, 6});
         host.add({.name = "KeltoNRXHIDDriver", .properties = {{"LocationID", 1233}}});
         host.add({.name = "another", .properties = {{"LocationID", 1234}}});
-        host.add({.name = "KeltoNRXHIDDriver",
-                  .properties = {{"LocationID", 1234}},
-                  .unit = std::make_shared<mirror>()});
+        put_base_services(host);
     }
 
     // Runs an operation with the whole room, of which one that fails leaves all.
@@ -63,7 +40,6 @@ protected:
 
     [[nodiscard]] byte_list buffer_bytes() const { return {buffer.begin(), buffer.end()}; }
 
-    interface_driver& accel = put_service(host, "accel", 31);
     std::array<std::uint8_t, 16> buffer{};
     platform::byte_span room = buffer;
     const byte_list value{8, 9};
@@ -116,7 +92,8 @@ TEST_F(channel_operations, find_open_call_close_and_release) {
         EXPECT_EQ(lines(host.log().begin() + before, host.log().end()),
                   is_hid ? on_hid_driver : on_accel);
     }
-    EXPECT_EQ(*accel.report(0xd0), value);
+    EXPECT_EQ(nrx::get_report("accel", 0xd0, room = buffer), platform::success);
+    EXPECT_EQ(byte_list(room.begin(), room.end()), value);
 }
 
 TEST_F(channel_operations, report_the_step_that_fails_and_end_there) {

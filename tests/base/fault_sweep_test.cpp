@@ -13,42 +13,15 @@
 #include "nrxctl/base/service_discovery.h"
 #include "nrxctl/base/service_list.h"
 #include "nrxctl/base/service_property.h"
-#include "tests/support/device_test.h"
+#include "tests/base/base_host.h"
+
+namespace tests {
 
 namespace {
 
-using namespace tests;
-
-// A driver of its own type, whose one method answers with a byte.
-class zumo_driver final : public platform::simulated::driver {
-public:
-    platform::return_code open(std::uint32_t type) override {
-        return type == 0x7a756d6f ? platform::success : platform::unsupported;
-    }
-    platform::return_code call(std::uint32_t /*selector*/, const platform::call_inputs& /*inputs*/,
-                               platform::call_outputs& outputs) override {
-        return platform::simulated::answer(byte_list{1}, outputs);
-    }
-};
-
 std::unique_ptr<machine> make_host() {
     auto host = std::make_unique<machine>();
-    auto& accel = put_service(*host, "accel", 31);
-    accel.set_report(0xd0, {1, 2, 3});
-    accel.set_command(0x20, [](platform::byte_view, byte_list& reply) {
-        reply = {1};
-        return platform::success;
-    });
-    accel.set_named_property("gain", {1, 2});
-    accel.set_scalar_method([](std::span<const std::uint64_t>) { return platform::success; });
-    auto& mca = put_service(*host, "mca", 33);
-    for (const std::uint32_t command : {0x20U, 0x22U})
-        mca.set_command(command, [](platform::byte_view, byte_list&) { return platform::success; });
-    mca.set_report(0x16, {});
-    mca.set_report(0xd8, {});
-    host->add({.name = "KeltoNRXHIDDriver",
-               .properties = {{"LocationID", 1234}},
-               .unit = std::make_shared<zumo_driver>()});
+    put_base_services(*host);
     put_service(*host, "profile", 32).set_report(0xd1, byte_list(96));
     const auto app = host->add({.name = "NRXApp"});
     host->add({.name = "client", .unit = std::make_shared<interface_driver>()}, app);
@@ -141,3 +114,5 @@ TEST(base_fault_sweep, discovery_and_properties) {
 }
 
 }  // namespace
+
+}  // namespace tests

@@ -13,7 +13,7 @@ std::string dumped(const std::vector<std::uint8_t>& bytes, std::string_view labe
     return tests::capture([&] { nrx::hex_dump(bytes, label); }).out;
 }
 
-TEST(hex_dump, keeps_its_columns_on_a_short_last_line) {
+TEST(hex_dump, prints_sixteen_bytes_to_a_line_behind_the_label_and_keeps_its_columns) {
     EXPECT_EQ(dumped({}, "payload"), "");
     EXPECT_EQ(dumped({0x41, 0x20, 0x80}),
               "00000000: 41 20 80                                          | A..\n");
@@ -21,9 +21,6 @@ TEST(hex_dump, keeps_its_columns_on_a_short_last_line) {
               "00000000: 01 02 03 04 05 06 07 7e                           | .......~ \n");
     EXPECT_EQ(dumped({'a', 'b', 'c', 'd', 'e', 'f', 'g', 'h', 'i'}),
               "00000000: 61 62 63 64 65 66 67 68  69                       | abcdefgh i\n");
-}
-
-TEST(hex_dump, prints_sixteen_bytes_to_a_line_behind_the_label) {
     std::vector<std::uint8_t> bytes(17);
     std::iota(bytes.begin(), bytes.end(), std::uint8_t{0x1c});
     EXPECT_EQ(dumped(bytes, "payload"),

@@ -1,6 +1,6 @@
 #include "nrxctl/base/mca.h"
 
-#include "tests/support/device_test.h"
+#include "tests/base/base_host.h"
 
 namespace tests {
 
@@ -44,13 +44,7 @@ const std::vector<direction> directions{
 using mca = device_test;
 
 TEST_F(mca, is_switched_in_steps_and_ends_at_the_one_that_fails_which_is_reported_twice) {
-    auto& service = put_service(host, "mca", 33);
-    for (const std::uint32_t command : {0x20U, 0x22U}) {
-        service.set_command(command,
-                            [](platform::byte_view, byte_list&) { return platform::success; });
-    }
-    service.set_report(0x16, {});
-    service.set_report(0xd8, {});
+    put_base_services(host);
     const std::string twice = failed("base/command_channel.cpp", "kr == 0 ", io_text) +
                               failed("base/mca.cpp", "kr == 0 ", io_text);
     for (const auto& [on, steps] : directions) {

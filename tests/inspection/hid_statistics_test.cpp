@@ -36,9 +36,7 @@ TEST_F(hid_statistics, each_operation_has_its_label_and_its_kind_of_value) {
                   "TALY_CALLBACK: push " + key + " -1.5\n")
             << operation;
     }
-}
-
-TEST_F(hid_statistics, values_are_whole_32_bit_numbers_and_fractions_of_16_bits) {
+    // Whole 32-bit numbers, and fractions of 16 bits.
     EXPECT_EQ(printed(record(2, 48, std::numeric_limits<std::int32_t>::min())),
               "TALY_CALLBACK: set ? -2147483648\n");
     EXPECT_EQ(printed(record(5, 48, std::numeric_limits<std::int32_t>::max())),

@@ -1,14 +1,9 @@
-// What the wrist device sends of its own accord, and the drivers that are called beside their
-// reports.
+// What the wrist device sends of its own accord, and the driver of its HID devices.
 
 #include <map>
 #include <set>
 
-#include "nrxctl/base/command_channel.h"
 #include "nrxctl/base/hid_driver.h"
-#include "nrxctl/base/mca.h"
-#include "nrxctl/base/named_property.h"
-#include "nrxctl/base/scalar_method.h"
 #include "platform/clock.h"
 #include "platform/hid_event_client.h"
 #include "platform/hid_plugin.h"
@@ -27,18 +22,9 @@ protected:
     wrist_events() {
         add_interface_services(host);
         add_hid_devices(host);
-        add_named_properties(host);
-        add_mca(host);
         add_hid_driver(host);
         add_spi_records(host);
         add_hid_events(host);
-    }
-
-    static byte_list property(std::string_view service, std::string_view name) {
-        std::array<std::uint8_t, 64> room{};
-        platform::byte_span value = room;
-        EXPECT_EQ(nrx::get_named_property(service, name, value), platform::success);
-        return {value.begin(), value.end()};
     }
 
     static void ask_driver(const byte_list& request, platform::return_code expected,
@@ -106,32 +92,6 @@ TEST_F(wrist_events, events_come_in_their_rhythm_and_a_vendor_event_is_late_at_t
     }
 }
 
-TEST_F(wrist_events, mca_tells_what_it_was_switched_to_and_takes_nothing_out_of_shape) {
-    for (const bool on : {true, false}) {
-        capture([&] { EXPECT_EQ(nrx::switch_mca(on), platform::success); });
-        const std::uint8_t bit = on ? 1 : 0;
-        const std::uint8_t high = on ? 3 : 0;
-        EXPECT_EQ(property("mca", "power"), byte_list{bit});
-        EXPECT_EQ(property("mca", "mode-16"), (byte_list{high, 0, 0, 0}));
-        EXPECT_EQ(property("mca", "mode-60"), (byte_list{bit, 0, 0, 0}));
-        EXPECT_EQ(property("mca", "mode-128"), (byte_list{high, 0, 0, 0}));
-    }
-    // A payload with one byte wrong is refused.
-    for (const std::size_t offset : {0U, 4U, 5U, 68U}) {
-        byte_list payload(69);
-        payload[0] = 60;
-        payload[4] = 1;
-        payload[offset] += 7;
-        EXPECT_EQ(reported(platform::bad_argument,
-                           [&] {
-                               platform::byte_span none;
-                               return nrx::send_command("mca", 0x22, payload, none,
-                                                        nrx::command_failure::is_silent);
-                           }),
-                  "");
-    }
-}
-
 TEST_F(wrist_events, the_hid_driver_answers_requests_about_the_devices_that_are_there) {
     ask_driver({1, 0, 0, 0, 9, 0, 0, 0}, platform::success, {7});
     ask_driver({2, 0, 0, 0, 0x40, 0, 0, 0}, platform::success, {2});
@@ -142,14 +102,6 @@ TEST_F(wrist_events, the_hid_driver_answers_requests_about_the_devices_that_are_
     host.remove("wqr-button-hid");
     ask_driver({1, 0, 0, 0, 9, 0, 0, 0}, platform::success, {6});
     ask_driver({2, 0, 0, 0, 0x40, 0, 0, 0}, platform::not_found);
-}
-
-TEST_F(wrist_events, a_self_test_leaves_its_result_in_a_property) {
-    const std::vector<std::uint64_t> number{5};
-    EXPECT_EQ(property("gyro", "self-test"), byte_list(4));
-    EXPECT_EQ(nrx::call_scalar_method("gyro", number), platform::success);
-    EXPECT_EQ(property("gyro", "self-test"), (byte_list{5, 0, 0, 0}));
-    reported(platform::unsupported, [&] { return nrx::call_scalar_method("mux", number); });
 }
 
 }  // namespace
