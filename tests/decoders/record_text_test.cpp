@@ -52,7 +52,7 @@ TEST_F(event_line, numbers_of_every_length_are_right_aligned_and_never_cut) {
     };
     std::uint64_t value = 1;
     for (std::size_t zeros = 0; zeros < 20; ++zeros, value *= 10) {
-        global_id(value, "1" + std::string(zeros, '0'));
+        global_id(value, std::string("1").append(zeros, '0'));
         if (zeros > 0) global_id(value - 1, std::string(zeros, '9'));
     }
     for (std::uint32_t bits = 0; bits < 32; ++bits) {

@@ -102,7 +102,7 @@ com.kelto.wqr.audio.btmspk.prewarm.duration ? com.kelto.wqr.test
 )");
     std::string name;
     for (int key = 0; key < 256; ++key) {
-        if (!(names >> name)) name = "?";
+        if (!(names >> name)) name.assign(1, '?');
         EXPECT_EQ(printed(record(0, static_cast<std::uint8_t>(key), 0)),
                   "TALY_CALLBACK: NOP" + name + "\n")
             << key;

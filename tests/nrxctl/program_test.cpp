@@ -197,7 +197,7 @@ TEST(nrxctl_program, interrupted_as_soon_as_it_begins_it_ends_all_the_same) {
     const std::string found = "Found an id for service = 16\n";
     for (const auto& [words, begins, ends] : rows<std::string, std::string, std::string>{
              {"--profile human auto wake:all", "humanReadable=enabled)\n", "done\n"},
-             {"--spi-status 0x10 1", found, found},
+             {"--spi-status 0x10 0xffffffff", found, found},
          }) {
         for (int round = 0; round < 10; ++round) {
             running_program begun(program, split(words));
