@@ -116,6 +116,7 @@ TEST(parse_payload, refuses_what_does_not_fit_the_width_and_what_is_no_number_in
         {{"100"}, "Value 256 (0100) is bigger than allowed (255, 0xff)\n"},
         {{"u16", "1", "10000"}, "Value 65536 (010000) is bigger than allowed (65535, 0xffff)\n"},
         {{"0d-5"}, "Value -5 (0fffffffffffffffb) is bigger than allowed (255, 0xff)\n"},
+        {{"u16", "u8", "1"}, "payload value is invalid (u8)\n"},
         {{"u32", "0d-1"},
          "Value -1 (0ffffffffffffffff) is bigger than allowed (4294967295, 0xffffffff)\n"},
     };

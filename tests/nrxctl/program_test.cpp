@@ -283,15 +283,16 @@ TEST(nrxctl_program, spi_status_is_switched_off_again_when_interrupted) {
 }
 
 TEST(nrxctl_program, interrupted_after_a_watch_it_ends_as_ever) {
-    // Nothing is ever written into this sample file: the option behind the watch blocks.
+    // Nothing is ever written into this sample file: the option behind the watch blocks in it.
     const std::string path = testing::TempDir() + "fifo-" + std::to_string(::getpid());
     ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0);
     for (const std::string watch : {"--events 0", "--spi-status accel 0"}) {
+        const int writer = ::open(path.c_str(), O_RDWR | O_CLOEXEC);
         running_program blocked(program, split(watch + " --version --replay load " + path));
         ASSERT_TRUE(blocked.wait_for("nrxctl " NRXCTL_VERSION "\n"));
         blocked.send_interrupt();
-        // Lets it go on if the interrupt has not ended it.
-        ::close(::open(path.c_str(), O_WRONLY | O_NONBLOCK));
+        blocked.wait_for("more");  // until its end, or until it has had time enough
+        ::close(writer);
         EXPECT_EQ(blocked.finish(), 128 + SIGINT) << watch;
     }
     std::remove(path.c_str());
