@@ -33,7 +33,7 @@ protected:
     // Runs an operation with the whole room, of which one that fails leaves all.
     std::string run(const operation& one, return_code expected) {
         room = buffer;
-        const std::string err = reported(expected, one.run);
+        std::string err = reported(expected, one.run);
         EXPECT_TRUE(expected == platform::success || room.size() == buffer.size());
         return err;
     }
@@ -81,10 +81,10 @@ TEST_F(channel_operations, find_open_call_close_and_release) {
         EXPECT_EQ(run(one, platform::success), "");
         const byte_list reply = one.reply.empty() ? buffer_bytes() : one.reply;
         EXPECT_EQ(byte_list(room.begin(), room.end()), reply);
-        const lines on_accel{
-            "first match {IOProviderClass = \"KeltoNRXInterface\"; "
-            "IOPropertyMatch = {service_id = 31}}",
-            "open accel type 0", one.call, "close accel", "release accel"};
+        const std::string interface_31 =
+            R"({IOProviderClass = "KeltoNRXInterface"; IOPropertyMatch = {service_id = 31}})";
+        const lines on_accel{"first match " + interface_31, "open accel type 0", one.call,
+                             "close accel", "release accel"};
         const lines on_hid_driver{
             R"(first match {IONameMatch = "KeltoNRXHIDDriver"; LocationID = 1234})",
             "open KeltoNRXHIDDriver type 2054516079", one.call, "close KeltoNRXHIDDriver",

@@ -28,12 +28,14 @@ struct direction {
     lines steps;
 };
 
+const std::string buffer_words =
+    "00 00 00 00 00 00 00 00 00 00 00 00 80 00 00 00 00 00 00 00 00 20 00 00";
+
 const std::vector<direction> directions{
     {true,
      {"call mca 3 scalars [0x20] in [01] results 0 room 0", mode_call("10 00 00 00 01 03 00 00 00"),
       mode_call("3c 00 00 00 01 01 00 00 00"), mode_call("80 00 00 00 01 03 00 00 00"),
-      "call mca 1 scalars [0xd8] in [00 00 00 00 00 00 00 00 00 00 00 00 80 00 00 00 "
-      "00 00 00 00 00 20 00 00] results 0 room 0",
+      "call mca 1 scalars [0xd8] in [" + buffer_words + "] results 0 room 0",
       "call mca 1 scalars [0x16] in [10 27 00 00] results 0 room 0"}},
     {false,
      {"call mca 1 scalars [0x16] in [00 00 00 00] results 0 room 0",
@@ -51,7 +53,7 @@ TEST_F(mca, is_switched_in_steps_and_ends_at_the_one_that_fails_which_is_reporte
         auto made = static_cast<std::ptrdiff_t>(logged("call").size());
         const auto calls = [&] {
             const lines all = logged("call");
-            const lines further(all.begin() + made, all.end());
+            lines further(all.begin() + made, all.end());
             made = static_cast<std::ptrdiff_t>(all.size());
             return further;
         };

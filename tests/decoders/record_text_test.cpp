@@ -82,7 +82,7 @@ TEST_F(event_line, no_record_makes_a_line_longer_than_its_bound) {
 TEST_F(event_line, is_printed_unless_it_is_no_utf8) {
     const auto printed = [](std::string_view name) {
         const auto record = with_text(record_of({0, 4, 0, 9}), 32, name);
-        const std::string text = capture([&] { nrx::print_profile_record(record); }).out;
+        std::string text = capture([&] { nrx::print_profile_record(record); }).out;
         nrx::event_text line;
         const auto formatted = nrx::format_profile_record(record, line);
         EXPECT_EQ(text, formatted ? decoded(record) + "\n" : "");

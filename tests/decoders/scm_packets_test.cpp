@@ -43,10 +43,11 @@ private:
 
 TEST_F(scm_packets, a_transfer_names_bus_event_direction_and_both_times) {
     const std::vector<std::string> buses{"spi0", "smb0", "smb1", "i2cm0", "i2c_ctrl0", "i2c_ctrl1"};
-    for (std::uint8_t bus = 0; bus < buses.size(); ++bus) {
+    for (std::size_t i = 0; i < buses.size(); ++i) {
+        const auto bus = static_cast<std::uint8_t>(i);
         const std::string times = " wqr_timestamp=5 scm_timestamp=78187493530\n";
-        EXPECT_EQ(print(transfer(bus, 12, 0, 5)), buses[bus] + ".12: scm_read" + times);
-        EXPECT_EQ(print(transfer(bus, 255, 1, 5)), buses[bus] + ".255: scm_write" + times);
+        EXPECT_EQ(print(transfer(bus, 12, 0, 5)), buses[i] + ".12: scm_read" + times);
+        EXPECT_EQ(print(transfer(bus, 255, 1, 5)), buses[i] + ".255: scm_write" + times);
     }
     auto late = record_of({9, 0, 0, 3}, {{20, 8, 18446744073709551615U}});
     late.bytes[15] = 0x80;

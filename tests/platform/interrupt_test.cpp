@@ -33,7 +33,7 @@ bool has_default_action() {
 }  // namespace
 
 class interrupt : public queue_test {
-protected:
+public:
     interrupt() {
         handled = 0;
         on_handle = nullptr;
@@ -43,6 +43,8 @@ protected:
         platform::restore_default_interrupt();
         EXPECT_TRUE(has_default_action());
     }
+    interrupt(const interrupt&) = delete;
+    interrupt& operator=(const interrupt&) = delete;
 };
 
 TEST_F(interrupt, is_handled_once_when_a_platform_call_returns_and_not_before) {

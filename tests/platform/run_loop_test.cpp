@@ -26,9 +26,13 @@ using platform::simulated::endless_wait;
 using seen = std::vector<std::pair<int, clock_time>>;
 
 class event_loop : public device_test {
-protected:
+public:
+    event_loop() = default;
     ~event_loop() override { platform::restore_default_interrupt(); }
+    event_loop(const event_loop&) = delete;
+    event_loop& operator=(const event_loop&) = delete;
 
+protected:
     platform::hid_interface listen(const char* name) {
         auto device = query_hid_interface(create_hid_plugin(service_named(name)));
         const auto note = [this](platform::byte_view record) {

@@ -50,10 +50,13 @@ platform::service service_named(std::string_view name);
 // A host that is empty at first, installed for the length of the test; nothing may be left open on
 // it when the handles of the fixture are gone.
 class device_test : public ::testing::Test {
-protected:
+public:
     device_test() { host.record_calls(); }
     ~device_test() override { EXPECT_EQ(host.open_handles(), 0U); }
+    device_test(const device_test&) = delete;
+    device_test& operator=(const device_test&) = delete;
 
+protected:
     // The logged events that begin with a word ("call", "open", "close").
     [[nodiscard]] std::vector<std::string> logged(std::string_view word) const;
 

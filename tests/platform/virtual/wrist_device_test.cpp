@@ -19,8 +19,11 @@ const std::vector<std::string> sensors{"accel",    "gyro", "compass",
                                        "pressure", "als",  "temperature"};
 
 class wrist_device : public ::testing::Test {
-protected:
+public:
+    wrist_device() = default;
     ~wrist_device() override { EXPECT_EQ(device_->open_handles(), 0U); }
+    wrist_device(const wrist_device&) = delete;
+    wrist_device& operator=(const wrist_device&) = delete;
 
 private:
     std::unique_ptr<platform::simulated::machine> device_ =
