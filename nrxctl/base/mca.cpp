@@ -8,6 +8,7 @@
 
 #include "nrxctl/base/command_channel.h"
 #include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/little_endian.h"
 #include "nrxctl/base/output.h"
 
 namespace nrx {
@@ -28,12 +29,6 @@ struct step_payload {
     std::size_t size = 0;
 };
 
-constexpr void put_word(step_payload& payload, std::size_t offset, std::uint32_t word) {
-    for (std::size_t i = 0; i < sizeof(word); ++i) {
-        payload.bytes[offset + i] = static_cast<std::uint8_t>(word >> (8 * i));
-    }
-}
-
 constexpr step_payload one_byte(std::uint8_t byte) {
     return {{byte}, 1};
 }
@@ -42,7 +37,7 @@ constexpr step_payload one_byte(std::uint8_t byte) {
 constexpr step_payload words(std::initializer_list<std::uint32_t> values) {
     step_payload payload;
     for (const std::uint32_t value : values) {
-        put_word(payload, payload.size, value);
+        store_le(payload.bytes.data() + payload.size, value);
         payload.size += sizeof(value);
     }
     return payload;
@@ -51,9 +46,9 @@ constexpr step_payload words(std::initializer_list<std::uint32_t> values) {
 // The mode of a setting: the setting, a byte that is always 1, the mode, and zeros.
 constexpr step_payload mode_of(std::uint32_t setting, std::uint32_t mode) {
     step_payload payload;
-    put_word(payload, 0, setting);
+    store_le(payload.bytes.data(), setting);
     payload.bytes[4] = 1;
-    put_word(payload, 5, mode);
+    store_le(payload.bytes.data() + 5, mode);
     payload.size = mode_payload_size;
     return payload;
 }

@@ -25,7 +25,12 @@ std::optional<std::int64_t> read_digits(std::string_view digits, int base);
 // ends the process with status 1 after "message (word)" as a line on standard output.
 std::int64_t parse_number(std::string_view word, std::string_view message);
 
-// The same, refused likewise if it is negative or beyond the largest.
+// The low 32 bits of such a number.
+inline std::uint32_t parse_low_32_bits(std::string_view word, std::string_view message) {
+    return static_cast<std::uint32_t>(parse_number(word, message));
+}
+
+// The number itself, refused likewise if it is negative or beyond the largest.
 std::uint32_t parse_number_up_to(std::uint32_t largest, std::string_view word,
                                  std::string_view message);
 

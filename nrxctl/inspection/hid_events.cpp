@@ -1,11 +1,11 @@
 #include "nrxctl/inspection/hid_events.h"
 
-#include <algorithm>
 #include <bit>
 #include <cstdint>
 #include <iomanip>
 #include <ios>
 
+#include "nrxctl/base/field_text.h"
 #include "nrxctl/base/tick_period.h"
 #include "nrxctl/inspection/event_stream.h"
 #include "nrxctl/inspection/hid_event_times.h"
@@ -56,13 +56,6 @@ void print_accelerometer(std::ostream& out, const event_time& time,
         << event.integer(platform::accelerometer_sequence);
 }
 
-std::string_view vendor_text(const platform::hid_event& event) {
-    const auto& data = event.vendor_data;
-    const auto end = std::find(data.begin(), data.end(), 0);
-    return {reinterpret_cast<const char*>(data.data()),
-            static_cast<std::size_t>(end - data.begin())};
-}
-
 void print_vendor_defined(std::ostream& out, const event_time& time,
                           const platform::hid_event& event, std::string_view label) {
     constexpr int width = 11;
@@ -73,9 +66,9 @@ void print_vendor_defined(std::ostream& out, const event_time& time,
     const double since_last = wall - last_wall_time;
     switch_to_fixed_notation(out);
     out << "now: " << std::setw(width) << now << " ts: " << std::setw(width) << time.happened
-        << " delta: " << std::setw(width) << now - time.happened << "\t '" << vendor_text(event)
-        << "' \t wall: " << std::setw(width) << wall << " delta: " << std::setw(width) << " "
-        << since_last << label << " ";
+        << " delta: " << std::setw(width) << now - time.happened << "\t '"
+        << text_before_nul(event.vendor_data) << "' \t wall: " << std::setw(width) << wall
+        << " delta: " << std::setw(width) << " " << since_last << label << " ";
     const bool is_on_beat = shortest_beat < since_last && since_last < longest_beat;
     if (!is_on_beat) out << "<-------------------------------";
     last_wall_time = wall;

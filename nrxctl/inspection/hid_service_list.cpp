@@ -18,7 +18,7 @@ namespace {
 constexpr std::string_view hid_interface_class = "KeltoNRXHIDInterface";
 constexpr std::string_view no_list = "Can't enumerate HID services";
 
-void list_services() {
+void print_names() {
     std::vector<platform::service> services;
     const auto listed =
         platform::all_matches(platform::matching_class(hid_interface_class), services);
@@ -49,7 +49,7 @@ void print_matching(std::string_view name) {
 }  // namespace
 
 void print_hid_services(std::string_view service_name) {
-    list_services();
+    print_names();
     print_matching(prefixed_name(service_name));
     print_matching(service_name);
     print_line("\n\n");

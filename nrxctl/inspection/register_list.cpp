@@ -18,11 +18,7 @@ constexpr sensor_report register_report{0x38, 1024, 0, reply_extent::variable};
 constexpr std::size_t header_size = 4;
 constexpr std::size_t entry_size = 4;
 constexpr std::size_t value_offset = 2;
-
-// At least two hexadecimal digits.
-void append_hex(text_line& line, std::uint16_t number) {
-    line.text(number < 0x10 ? "0" : "").hex(number);
-}
+constexpr std::size_t digits = 2;  // at least
 
 void append_registers(text_line& line, const sensor_reply& list) {
     const std::uint64_t count = list.number<std::uint32_t>();
@@ -32,8 +28,8 @@ void append_registers(text_line& line, const sensor_reply& list) {
     }
     for (std::size_t i = 0; i < count; ++i) {
         const std::size_t entry = header_size + i * entry_size;
-        append_hex(line.text("R"), list.number<std::uint16_t>(entry));
-        append_hex(line.text("="), list.number<std::uint16_t>(entry + value_offset));
+        line.text("R").zero_padded_hex(list.number<std::uint16_t>(entry), digits);
+        line.text("=").zero_padded_hex(list.number<std::uint16_t>(entry + value_offset), digits);
         line.text(" ");
     }
 }

@@ -1,6 +1,5 @@
 #include "nrxctl/replay/axis_event.h"
 
-#include <algorithm>
 #include <array>
 #include <cmath>
 #include <cstdlib>
@@ -10,6 +9,7 @@
 #include "nrxctl/base/fixed_point.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/word_table.h"
 
 namespace nrx {
 
@@ -43,7 +43,7 @@ std::int32_t sine_value(const signal_sample& sample) {
 }
 
 struct signal_row {
-    std::string_view type;
+    std::string_view word;
     std::int32_t (*value)(const signal_sample& sample);
 };
 
@@ -53,13 +53,6 @@ constexpr std::array signals{
     signal_row{"step", step_value},
     signal_row{"sin", sine_value},
 };
-
-// Null for a word that is no type of signal.
-const signal_row* find_signal(std::string_view type) {
-    const auto* row = std::find_if(signals.begin(), signals.end(),
-                                   [&](const signal_row& known) { return known.type == type; });
-    return row == signals.end() ? nullptr : row;
-}
 
 // A generated sample is as warm as a wrist: 28.80 degrees.
 constexpr std::string_view generated_temperature = "2880";
@@ -80,7 +73,7 @@ bool AxisEvent::parse(const sample_values& values) {
 }
 
 bool AxisEvent::init_generator(std::string_view signal_type) {
-    if (find_signal(signal_type) == nullptr) return false;
+    if (find_word_row(signals, signal_type) == nullptr) return false;
     std::srand(static_cast<unsigned>(std::time(nullptr)));
     next_sample_ = 0;
     timestamp_ = 0;
@@ -89,7 +82,7 @@ bool AxisEvent::init_generator(std::string_view signal_type) {
 
 std::string AxisEvent::generate(std::string_view signal_type, std::uint32_t interval,
                                 std::uint32_t samples) {
-    const signal_row* signal = find_signal(signal_type);
+    const signal_row* signal = find_word_row(signals, signal_type);
     const std::int32_t value = signal == nullptr ? 0 : signal->value({next_sample_, samples});
     text_line line;
     line.text(name()).text(",x=0x").zero_padded_hex(static_cast<std::uint32_t>(value), 8);

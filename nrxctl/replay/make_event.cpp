@@ -1,8 +1,8 @@
 #include "nrxctl/replay/make_event.h"
 
-#include <algorithm>
 #include <array>
 
+#include "nrxctl/base/word_table.h"
 #include "nrxctl/replay/axis_event.h"
 #include "nrxctl/replay/pressure_event.h"
 
@@ -16,7 +16,7 @@ event_ptr make() {
 }
 
 struct event_class {
-    std::string_view tag;
+    std::string_view word;  // the tag
     event_maker make;
 };
 
@@ -30,9 +30,8 @@ constexpr std::array event_classes{
 }  // namespace
 
 event_maker find_event_maker(std::string_view tag) {
-    const auto* row = std::find_if(event_classes.begin(), event_classes.end(),
-                                   [&](const event_class& known) { return known.tag == tag; });
-    return row == event_classes.end() ? nullptr : row->make;
+    const event_class* known = find_word_row(event_classes, tag);
+    return known == nullptr ? nullptr : known->make;
 }
 
 event_ptr make_event(std::string_view tag) {

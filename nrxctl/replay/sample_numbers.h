@@ -11,7 +11,7 @@ namespace nrx {
 // The low 32 bits of a number. A text that is none ends the process with status 1, after a message
 // with the text on standard output.
 inline std::uint32_t parse_sample(std::string_view text) {
-    return static_cast<std::uint32_t>(parse_number(text, "error converting samples"));
+    return parse_low_32_bits(text, "error converting samples");
 }
 
 // A time stamp: the low 32 bits of a number, widened with their sign. Ends the process likewise.

@@ -19,15 +19,11 @@ bool is_frequency(std::string_view word) {
     return word.size() > unit_length && (word.ends_with("hz") || word.ends_with("Hz"));
 }
 
-std::uint32_t parse_u32(std::string_view word, std::string_view message) {
-    return static_cast<std::uint32_t>(parse_number(word, message));
-}
-
 // How many samples there are in one period. None, with a failure report, if there is no period, or
 // no sample in it; an interval of 0 is one of these.
 std::optional<std::uint32_t> samples_per_period(std::string_view word, std::uint32_t interval) {
     const std::uint32_t hz =
-        parse_u32(word.substr(0, word.size() - unit_length), "invalid frequency");
+        parse_low_32_bits(word.substr(0, word.size() - unit_length), "invalid frequency");
     if (!check(hz, "hz")) return std::nullopt;
     const std::uint32_t product = hz * interval;
     const std::uint32_t num_samples = product == 0 ? 0 : microseconds_per_second / product;
@@ -47,10 +43,10 @@ std::optional<signal_request> read_signal_request(argument_words& words) {
     const auto interval_word = words.take();
     const auto count_word = words.take();
     if (!check(count_word, "argc >= optind+4")) return std::nullopt;
-    signal_request request{*service, *signal_type, parse_u32(*interval_word, "invalid interval"),
-                           0};
+    signal_request request{*service, *signal_type,
+                           parse_low_32_bits(*interval_word, "invalid interval"), 0};
     if (!is_frequency(*count_word)) {
-        request.samples = parse_u32(*count_word, "invalid number of samples");
+        request.samples = parse_low_32_bits(*count_word, "invalid number of samples");
         return request;
     }
     const auto samples = samples_per_period(*count_word, request.interval);

@@ -61,7 +61,7 @@ void schedule_enable(argument_words& words) {
     if (!replay_is_enabled()) return;
     const auto delay_word = words.take();
     if (!check(delay_word, "argc > optind")) return;
-    const auto delay = static_cast<std::uint32_t>(parse_number(*delay_word, "invalid delay"));
+    const std::uint32_t delay = parse_low_32_bits(*delay_word, "invalid delay");
     set_state(words, delay, replay_state::enabled);
 }
 
