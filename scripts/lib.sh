@@ -58,12 +58,13 @@ quietly() {
     }
 }
 
-# configure PRESET [CMAKE WORDS...]: brings build/PRESET in line with the preset.
+# configure PRESET [CMAKE WORDS...]: brings the folder of the preset in line with it.
 configure() {
     quietly cmake -S "$root" --preset "$@" || die "cannot configure the preset $1"
 }
 
-# build PRESET [TARGET...]: builds what is out of date. Quiet if nothing is.
+# build PRESET [TARGET...]: builds what is out of date in build/PRESET. Quiet if nothing is. A preset
+# that builds in the folder of another one (fuzz in asan's, bench in test's) goes by its name here.
 build() {
     local preset=$1
     shift
