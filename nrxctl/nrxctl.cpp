@@ -17,6 +17,7 @@
 namespace {
 
 using namespace nrx;
+using namespace nrx::nrxctl;
 
 constexpr int misuse_status = 2;
 

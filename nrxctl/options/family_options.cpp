@@ -5,6 +5,8 @@
 
 #include "nrxctl/nrxtoollib.h"
 
+namespace nrx::nrxctl {
+
 outcome profile(const option_words& words) {
     nrx::profile_command(words.argument, words.all, words.index);
     return outcome::done;
@@ -35,3 +37,5 @@ outcome show_sensor(const option_words& words) {
     nrx::print_sensor_info(words.argument, static_cast<std::int32_t>(level));
     return outcome::done;
 }
+
+}  // namespace nrx::nrxctl

@@ -7,6 +7,8 @@
 
 #include "platform/return_code.h"
 
+namespace nrx::nrxctl {
+
 // How an option went. The command families, the inspection of a sensor and the watch of SPI status
 // records say all that there is to say themselves: they are always done.
 enum class outcome { done, failed, misused };
@@ -24,3 +26,5 @@ struct option_words {
     // The next word; none at the end, and before the next option.
     [[nodiscard]] std::optional<std::string_view> take() const;
 };
+
+}  // namespace nrx::nrxctl

@@ -8,6 +8,8 @@
 #include "platform/interrupt.h"
 #include "platform/run_loop.h"
 
+namespace nrx::nrxctl {
+
 namespace {
 
 // As long as it lives, an interrupt stops the event loop; then the default action, which ends the
@@ -26,9 +28,9 @@ public:
 void set_clock_references() {
     constexpr double microseconds = 1e6;
     const platform::clock_reading now = platform::read_clocks();
-    nrx::monotonic_reference = nrx::tick_period * static_cast<double>(now.ticks);
-    nrx::wall_reference = static_cast<double>(now.wall.seconds) +
-                          static_cast<double>(now.wall.microseconds) / microseconds;
+    monotonic_reference = tick_period * static_cast<double>(now.ticks);
+    wall_reference = static_cast<double>(now.wall.seconds) +
+                     static_cast<double>(now.wall.microseconds) / microseconds;
 }
 
 }  // namespace
@@ -37,12 +39,11 @@ outcome watch_events(const option_words& words) {
     std::optional<std::chrono::seconds> duration;
     if (const auto word = words.take()) {
         constexpr auto longest = std::numeric_limits<std::int32_t>::max();
-        duration =
-            std::chrono::seconds(nrx::parse_number_up_to(longest, *word, "seconds are invalid"));
+        duration = std::chrono::seconds(parse_number_up_to(longest, *word, "seconds are invalid"));
     }
     set_clock_references();
     const interrupt_stops_loop stopping;
-    return outcome_of(nrx::watch_hid_events(duration));
+    return outcome_of(watch_hid_events(duration));
 }
 
 // The mode is switched off whatever became of the watch, and whoever interrupts that.
@@ -50,11 +51,13 @@ outcome watch_spi(const option_words& words) {
     const auto mode_word = words.take();
     if (!mode_word) return outcome::misused;
     constexpr auto largest_mode = std::numeric_limits<std::uint32_t>::max();
-    const std::uint32_t mode = nrx::parse_number_up_to(largest_mode, *mode_word, "mode is invalid");
+    const std::uint32_t mode = parse_number_up_to(largest_mode, *mode_word, "mode is invalid");
     std::int32_t service_id = 0;
-    if (!nrx::resolve_service_id(words.argument, service_id)) return outcome::failed;
+    if (!resolve_service_id(words.argument, service_id)) return outcome::failed;
     const interrupt_stops_loop stopping;
-    const platform::return_code result = nrx::watch_spi_status(service_id, mode);
-    if (mode != 0) nrx::watch_spi_status(service_id, 0);
+    const platform::return_code result = watch_spi_status(service_id, mode);
+    if (mode != 0) watch_spi_status(service_id, 0);
     return outcome_of(result);
 }
+
+}  // namespace nrx::nrxctl
