@@ -1,4 +1,4 @@
-# The flags every target of the project is built with, and the two functions that declare targets.
+# The flags every target of the project is built with, and the functions that declare targets.
 
 add_library(keyprobe_flags INTERFACE)
 target_compile_features(keyprobe_flags INTERFACE cxx_std_20)
@@ -22,14 +22,19 @@ if(KEYPROBE_COVERAGE)
   target_link_options(keyprobe_flags INTERFACE --coverage)
 endif()
 
-# keyprobe_library(NAME SOURCES ... HEADERS ... LINK ...): one static library per folder. Each header
-# is compiled on its own too, so that none depends on what was included before it.
+# keyprobe_headers(LIBRARY HEADER...): the headers of a library. Each is compiled on its own too, so
+# that none depends on what was included before it.
+function(keyprobe_headers library)
+  target_sources(${library} INTERFACE FILE_SET HEADERS BASE_DIRS "${PROJECT_SOURCE_DIR}" FILES
+                                      ${ARGN})
+  set_target_properties(${library} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
+endfunction()
+
+# keyprobe_library(NAME SOURCES ... HEADERS ... LINK ...): one static library per folder.
 function(keyprobe_library name)
   cmake_parse_arguments(ARG "" "" "SOURCES;HEADERS;LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_SOURCES})
-  target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS "${PROJECT_SOURCE_DIR}" FILES
-                                ${ARG_HEADERS})
-  set_target_properties(${name} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
+  keyprobe_headers(${name} ${ARG_HEADERS})
   target_link_libraries(${name} PUBLIC keyprobe_flags ${ARG_LINK})
 endfunction()
 
