@@ -2,7 +2,6 @@
 #pragma once
 
 #include <bit>
-#include <cstddef>
 #include <cstdint>
 #include <cstring>
 
@@ -21,13 +20,9 @@ template <class Number>
 std::uint64_t load_bytes(const char* source) {
     Number value;
     std::memcpy(&value, source, sizeof(Number));
-    if constexpr (std::endian::native == std::endian::big) {
-        Number swapped = 0;
-        for (std::size_t i = 0; i < sizeof(Number); ++i, value >>= 8)
-            swapped = static_cast<Number>(swapped << 8 | (value & 0xff));
-        return swapped;
-    }
-    return value;
+    return std::endian::native == std::endian::little
+               ? value
+               : __builtin_bswap64(value) >> (64 - 8 * sizeof(Number));
 }
 
 }  // namespace nrx

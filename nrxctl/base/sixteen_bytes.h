@@ -4,6 +4,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
+#include <initializer_list>
 
 #include "nrxctl/base/eight_bytes.h"
 
@@ -13,44 +14,21 @@
 
 namespace nrx {
 
-// Bit i of a result is of byte i, the first byte's is the lowest.
-class sixteen_bytes {
+// As two numbers, on any processor. Bit i of a result is of byte i, the first byte's is the lowest.
+class sixteen_bytes_in_halves {
 public:
     static constexpr std::size_t size = 16;
 
-#if defined(__SSE2__)
     // The bytes at a place.
-    explicit sixteen_bytes(const char* source) {
-        std::memcpy(&bytes_, source, size);
-    }
+    explicit sixteen_bytes_in_halves(const char* source)
+        : low_(load_bytes<std::uint64_t>(source)), high_(load_bytes<std::uint64_t>(source + 8)) {}
 
     // Which bytes are the same in both.
-    [[nodiscard]] std::uint32_t equal(const sixteen_bytes& other) const {
-        return bits_of(_mm_cmpeq_epi8(bytes_, other.bytes_));
-    }
-
-    // Which bytes are any of the three.
-    [[nodiscard]] std::uint32_t find(char one, char two, char three) const {
-        const auto found = _mm_or_si128(_mm_cmpeq_epi8(bytes_, _mm_set1_epi8(one)),
-                                        _mm_cmpeq_epi8(bytes_, _mm_set1_epi8(two)));
-        return bits_of(_mm_or_si128(found, _mm_cmpeq_epi8(bytes_, _mm_set1_epi8(three))));
-    }
-
-private:
-    static std::uint32_t bits_of(__m128i found) {
-        return static_cast<std::uint32_t>(_mm_movemask_epi8(found));
-    }
-
-    __m128i bytes_;
-#else
-    explicit sixteen_bytes(const char* source)
-        : low_(load_bytes<std::uint64_t>(source)), high_(load_bytes<std::uint64_t>(source + 8)) {
-    }
-
-    [[nodiscard]] std::uint32_t equal(const sixteen_bytes& other) const {
+    [[nodiscard]] std::uint32_t equal(const sixteen_bytes_in_halves& other) const {
         return zeros(low_ ^ other.low_) | zeros(high_ ^ other.high_) << 8;
     }
 
+    // Which bytes are any of the three.
     [[nodiscard]] std::uint32_t find(char one, char two, char three) const {
         std::uint32_t found = 0;
         for (const char byte : {one, two, three}) {
@@ -69,7 +47,41 @@ private:
 
     std::uint64_t low_;
     std::uint64_t high_;
-#endif
 };
+
+#if defined(__SSE2__)
+
+// The same members, where one register holds all bytes.
+class sixteen_bytes_in_register {
+public:
+    static constexpr std::size_t size = 16;
+
+    explicit sixteen_bytes_in_register(const char* source) { std::memcpy(&bytes_, source, size); }
+
+    [[nodiscard]] std::uint32_t equal(const sixteen_bytes_in_register& other) const {
+        return bits_of(_mm_cmpeq_epi8(bytes_, other.bytes_));
+    }
+
+    [[nodiscard]] std::uint32_t find(char one, char two, char three) const {
+        const auto found = _mm_or_si128(_mm_cmpeq_epi8(bytes_, _mm_set1_epi8(one)),
+                                        _mm_cmpeq_epi8(bytes_, _mm_set1_epi8(two)));
+        return bits_of(_mm_or_si128(found, _mm_cmpeq_epi8(bytes_, _mm_set1_epi8(three))));
+    }
+
+private:
+    static std::uint32_t bits_of(__m128i found) {
+        return static_cast<std::uint32_t>(_mm_movemask_epi8(found));
+    }
+
+    __m128i bytes_;
+};
+
+using sixteen_bytes = sixteen_bytes_in_register;
+
+#else
+
+using sixteen_bytes = sixteen_bytes_in_halves;
+
+#endif
 
 }  // namespace nrx
