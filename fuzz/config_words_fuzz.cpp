@@ -1,12 +1,11 @@
 // Configuration words, one to a line. What is accepted is one whole record per component; what
 // fails keeps what came before; the end of the process stays in the harness.
-#include <algorithm>
 #include <cstddef>
 #include <cstdint>
-#include <string>
 #include <string_view>
 #include <vector>
 
+#include "fuzz/support/command_line.h"
 #include "fuzz/support/harness.h"
 #include "nrxctl/profiler/config_grammar.h"
 #include "nrxctl/profiler/config_printer.h"
@@ -15,15 +14,6 @@
 namespace {
 
 using config_list = std::vector<nrx::profiler_config>;
-
-std::vector<std::string> lines_of(std::string_view text) {
-    std::vector<std::string> lines;
-    for (const std::string_view line : nrx::split(text, '\n')) {
-        // A NUL ends a word wherever it stands.
-        lines.emplace_back(std::string(line).c_str());
-    }
-    return lines;
-}
 
 // What one word becomes.
 struct parsed {
@@ -58,33 +48,30 @@ void check_word(std::string_view word, const parsed& one) {
 }
 
 // All words together are the words one by one, up to the first that fails.
-void check_words(std::vector<std::string>& words) {
-    std::vector<char*> pointers;
+void check_words(const fuzz::command_line& line) {
     config_list expected;
     bool all = true;
-    for (std::string& word : words) {
-        pointers.push_back(word.data());
-        if (!all) continue;
+    for (const std::string_view word : line.words()) {
+        if (!all) break;
         const parsed one = parse(word);
         check_word(word, one);
         expected.insert(expected.end(), one.configs.begin(), one.configs.end());
         all = one.completed && one.accepted;
     }
     int index = 0;
-    nrx::argument_words left(pointers, index);
+    nrx::argument_words left(line.words(), index);
     config_list together;
     bool accepted = false;
     const bool completed =
         fuzz::completes([&] { accepted = nrx::parse_profiler_configs(left, together); });
     fuzz::require((completed && accepted) == all);
     fuzz::require(nrx::encode_configs(together) == nrx::encode_configs(expected));
-    fuzz::require(index <= static_cast<int>(words.size()));
+    fuzz::require(index <= line.count());
 }
 
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    std::vector<std::string> words = lines_of(fuzz::as_text(data, size));
-    check_words(words);
+    check_words(fuzz::words_of(fuzz::as_text(data, size)));
     return 0;
 }

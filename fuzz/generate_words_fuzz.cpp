@@ -3,11 +3,10 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <optional>
 #include <string>
-#include <vector>
 
+#include "fuzz/support/command_line.h"
 #include "fuzz/support/harness.h"
 #include "nrxctl/base/little_endian.h"
 #include "nrxctl/replay/make_event.h"
@@ -18,23 +17,9 @@ namespace {
 
 constexpr std::uint32_t most_samples = 64;
 
-// A NUL ends a word wherever it stands.
-std::vector<std::string> words_of(std::string_view text) {
-    std::vector<std::string> words;
-    while (!text.empty()) {
-        const std::size_t length = std::min(text.find('\n'), text.size());
-        words.emplace_back(std::string(text.substr(0, length)).c_str());
-        text.remove_prefix(std::min(length + 1, text.size()));
-    }
-    return words;
-}
-
-std::optional<nrx::signal_request> read(std::vector<std::string>& words) {
-    std::vector<char*> pointers;
-    for (std::string& word : words)
-        pointers.push_back(word.data());
+std::optional<nrx::signal_request> read(const fuzz::command_line& line) {
     int index = 0;
-    nrx::argument_words left(pointers, index);
+    nrx::argument_words left(line.words(), index);
     std::optional<nrx::signal_request> request;
     fuzz::completes([&] { request = nrx::read_signal_request(left); });
     fuzz::require(!request || index == 4);
@@ -56,8 +41,8 @@ void check_line(const std::string& line, const nrx::signal_request& request, std
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    auto words = words_of(fuzz::as_text(data, size));
-    auto request = read(words);
+    const fuzz::command_line line = fuzz::words_of(fuzz::as_text(data, size));
+    auto request = read(line);
     if (!request) return 0;
     request->samples = std::min(request->samples, most_samples);
     nrx::generate_samples(*request);
