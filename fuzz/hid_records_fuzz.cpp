@@ -3,7 +3,6 @@
 // event.
 #include <algorithm>
 #include <cstdint>
-#include <string_view>
 #include <vector>
 
 #include "fuzz/support/harness.h"

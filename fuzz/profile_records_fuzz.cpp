@@ -1,5 +1,4 @@
 // Any bytes as profile event records, through all three printers.
-#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 

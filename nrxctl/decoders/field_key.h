@@ -1,8 +1,6 @@
 // The key that begins every field of an event line.
 #pragma once
 
-#include <cstddef>
-
 #include "nrxctl/decoders/short_text.h"
 
 namespace nrx {

@@ -5,7 +5,6 @@
 #include <array>
 #include <cstddef>
 #include <span>
-#include <string_view>
 
 #include "nrxctl/decoders/event_names.h"
 #include "nrxctl/decoders/record_layout.h"

@@ -1,10 +1,9 @@
 #include "nrxctl/decoders/profile_decoder.h"
 
-#include <optional>
-
 #include "nrxctl/decoders/boot_time.h"
 #include "nrxctl/decoders/calendar_time.h"
 #include "nrxctl/decoders/event_names.h"
+#include "nrxctl/decoders/id_names.h"
 #include "nrxctl/decoders/record_fields.h"
 #include "nrxctl/decoders/record_layout.h"
 

@@ -5,7 +5,7 @@
 
 #include "nrxctl/base/profile_record.h"
 #include "nrxctl/decoders/event_text.h"
-#include "nrxctl/decoders/id_names.h"
+#include "nrxctl/decoders/short_text.h"
 
 namespace nrx {
 

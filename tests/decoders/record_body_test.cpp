@@ -1,5 +1,4 @@
 // The body of a record, by its type and, for some records, by its category.
-#include <array>
 
 #include "tests/decoders/event_record.h"
 #include "tests/support/device_test.h"

@@ -2,7 +2,6 @@
 #include "nrxctl/decoders/record_text.h"
 
 #include "nrxctl/decoders/decoder_registry.h"
-#include "nrxctl/decoders/profile_hexdump.h"
 #include "nrxctl/decoders/utf8.h"
 #include "tests/decoders/event_record.h"
 #include "tests/support/device_test.h"

@@ -3,8 +3,8 @@
 #include "nrxctl/inspection/hid_event_watch.h"
 #include "nrxctl/inspection/spi_watch.h"
 #include "platform/run_loop.h"
-#include "tests/inspection/event_host.h"
 #include "tests/support/fault_sweep.h"
+#include "tests/support/hid_host.h"
 #include "tests/support/report_bytes.h"
 
 namespace tests {

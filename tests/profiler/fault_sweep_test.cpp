@@ -7,7 +7,7 @@
 #include "nrxctl/profiler/scm_monitor.h"
 #include "platform/clock.h"
 #include "platform/virtual/profiler/profiler.h"
-#include "tests/profiler/profiler_host.h"
+#include "tests/support/device_test.h"
 #include "tests/support/word_vector.h"
 
 namespace tests {

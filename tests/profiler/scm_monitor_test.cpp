@@ -2,7 +2,6 @@
 
 #include <chrono>
 #include <csignal>
-#include <utility>
 
 #include "tests/profiler/profiler_host.h"
 #include "tests/support/word_vector.h"

@@ -1,6 +1,5 @@
 #include "tests/replay/replay_host.h"
 
-#include <cstdio>
 #include <cstdlib>
 #include <unistd.h>
 

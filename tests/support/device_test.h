@@ -3,8 +3,6 @@
 
 #include <cstdint>
 #include <functional>
-#include <initializer_list>
-#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
