@@ -3,6 +3,7 @@
 #include <utility>
 
 #include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/open_connection.h"
 #include "nrxctl/base/service_discovery.h"
 
 namespace nrx {
@@ -10,10 +11,7 @@ namespace nrx {
 platform::return_code open_channel(platform::service found, std::uint32_t type, channel& opened) {
     opened.service = std::move(found);
     if (!check(opened.service, "service")) return platform::not_found;
-    const platform::return_code kr = platform::open(opened.service, type, opened.connect);
-    if (!check_success(kr, "kr == 0 ")) return kr;
-    if (!check(opened.connect, "connect")) return platform::no_memory;
-    return platform::success;
+    return open_connection(opened.service, type, opened.connect);
 }
 
 platform::return_code open_channel(std::string_view service_name, missing_service missing,

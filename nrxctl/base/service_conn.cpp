@@ -1,6 +1,7 @@
 #include "nrxctl/base/service_conn.h"
 
 #include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/open_connection.h"
 
 namespace nrx {
 
@@ -10,9 +11,7 @@ bool service_conn::open(bool quiet) {
     if (!check(service_, "service")) return false;
     child_ = platform::first_child(service_, platform::service_plane);
     if (!check(child_, "child")) return false;
-    const platform::return_code kr = platform::open(child_, 0, connection_);
-    if (!check_success(kr, "kr == 0 ")) return false;
-    return check(connection_, "connect");
+    return open_connection(child_, 0, connection_) == platform::success;
 }
 
 }  // namespace nrx

@@ -1,6 +1,7 @@
 #include "nrxctl/profiler/profiler_conn.h"
 
 #include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/open_connection.h"
 
 namespace nrx {
 
@@ -15,9 +16,7 @@ bool profiler_conn::open(presence driver) {
     service_ = platform::first_match({{std::string(platform::name_match_key), name_}});
     if (!service_ && driver == presence::is_optional) return false;
     if (!check(service_, "service")) return false;
-    const platform::return_code kr = platform::open(service_, 0, connection_);
-    if (!check_success(kr, "kr == 0 ")) return false;
-    return check(connection_, "connect");
+    return open_connection(service_, 0, connection_) == platform::success;
 }
 
 bool profiler_conn::open_queue(presence mapping) {
