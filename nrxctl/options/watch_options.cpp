@@ -53,7 +53,10 @@ outcome watch_spi(const option_words& words) {
     constexpr auto largest_mode = std::numeric_limits<std::uint32_t>::max();
     const std::uint32_t mode = parse_number_up_to(largest_mode, *mode_word, "mode is invalid");
     std::int32_t service_id = 0;
-    if (!resolve_service_id(words.argument, service_id)) return outcome::failed;
+    if (!resolve_service_id(words.argument, service_id)) {
+        print_line(text_line().text("service is invalid (").text(words.argument).text(")").view());
+        return outcome::failed;
+    }
     const interrupt_stops_loop stopping;
     const platform::return_code result = watch_spi_status(service_id, mode);
     if (mode != 0) watch_spi_status(service_id, 0);

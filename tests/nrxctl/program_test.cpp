@@ -68,7 +68,9 @@ TEST(nrxctl_program, numbers_that_are_none_or_out_of_range_end_it_with_status_1)
              {"--report accel 1 0x100001", "capacity is invalid (0x100001)\n"},
              {"--scalar accel 1 x", "scalar is invalid (x)\n"},
              {"--spi-status accel 4294967296", "mode is invalid (4294967296)\n"},
+             {"--spi-status 2147483648 1", "service is invalid (2147483648)\n"},
              {"--events 2147483648", "seconds are invalid (2147483648)\n"},
+             {"--profile human sensor:accel", "duration parameter is invalid (sensor:accel)\n"},
              {"--events 1.5", "seconds are invalid (1.5)\n"},
              {"--mca On", "mca is neither on nor off (On)\n"},
              {"--command accel 0x100000000", "command code is invalid (0x100000000)\n"},
@@ -138,7 +140,20 @@ TEST(nrxctl_program, reads_writes_and_commands_and_tells_by_its_status_whether_a
               "payload 00000000: 01 02                                             | ..\n");
     EXPECT_EQ(run("--command profile 0x7f").status, 1);
     EXPECT_EQ(run("--report profile 0xd5 3").status, 1);
-    EXPECT_EQ(run("--profile config bogus").status, 0);
+}
+
+TEST(nrxctl_program, families_have_the_words_before_the_next_option) {
+    for (const char* words : {"--profile config bogus sensor:gyro", "--scm 10 bogus scm:smb0",
+                              "--profile get-logs bad errdump", "--profile monitor 1 human"}) {
+        const auto result = run(std::string(words) + " --version");
+        EXPECT_EQ(result.status, 0) << words;
+        EXPECT_EQ(result.err.find("unknown word"), std::string::npos) << words;
+        EXPECT_TRUE(result.out.ends_with("nrxctl " NRXCTL_VERSION "\n")) << words;
+    }
+    const std::string accel = "    profiler sensor     is enabled [component=accel, reports=4]\n";
+    EXPECT_EQ(run("--profile config sensor:accel:data --profile get-config").out,
+              accel + "No client is connected\n\nActive components in kext:\n" + accel +
+                  "\nActive components in fw:\n" + accel);
 }
 
 TEST(nrxctl_program, profiles_for_a_time_and_ends_by_itself) {
