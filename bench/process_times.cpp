@@ -62,7 +62,7 @@ process_cost run_once(const std::vector<std::string>& words) {
     ::wait4(child, &status, 0, &used);
     const std::chrono::duration<double, std::micro> taken = clock::now() - begin;
     if (!WIFEXITED(status) || WEXITSTATUS(status) >= cannot_execute) give_up(words[0]);
-    return {taken.count(), static_cast<double>(used.ru_maxrss) / 1024};
+    return {taken.count(), static_cast<double>(used.ru_maxrss) * 1024 / 1e6};
 }
 
 }  // namespace bench
