@@ -58,17 +58,34 @@ TEST(extra_info, items_follow_each_other_without_anything_between_them) {
 }
 
 TEST(extra_info, ends_with_the_block_whatever_the_last_item_lacks) {
-    expect_rows(
-        {
-            {"\0"sv, "", number_base::decimal, 5},
-            {"\0\1\2\3"sv, "", number_base::decimal, 5},
-            {"\2ok\0\0\1\2"sv, "ok", number_base::decimal, 9},
-            {"\1\1\2\3\4\5\6\7"sv, "", number_base::decimal, 9},
-            {"\0\5\0\0\0\3\1"sv, "5\nExtraInfo   : ", number_base::decimal, 15},
-            {"\2"sv, ""},
-            {"\2unended"sv, "unended"},
-        },
-        number_base::decimal);
+    const std::string_view block = "\0\x0a\0\0\0\2ab\0\4\1\xff\0\0\0\0\0\0\0\3\5\0\x0b\0\0\0"sv;
+    struct step {
+        std::size_t length;  // from which on this is printed
+        std::string text;
+        number_base after = number_base::decimal;
+        std::size_t needed = 0;
+    };
+    const std::vector<step> steps{
+        {0, ""},
+        {1, "", number_base::decimal, 5},
+        {5, "10"},
+        {7, "10a"},
+        {8, "10ab"},
+        {10, "10ab", number_base::hexadecimal},
+        {11, "10ab", number_base::hexadecimal, 19},
+        {19, "10abff", number_base::hexadecimal},
+        {20, "10abff\nExtraInfo   : ", number_base::hexadecimal},
+        {21, "10abff\nExtraInfo   : "},
+        {22, "10abff\nExtraInfo   : ", number_base::decimal, 26},
+        {26, "10abff\nExtraInfo   : 11"},
+    };
+    ASSERT_EQ(block.size(), steps.back().length);
+    auto now = steps.begin();
+    for (std::size_t length = 0; length <= block.size(); ++length) {
+        if (now + 1 != steps.end() && now[1].length == length) ++now;
+        expect_rows({{block.substr(0, length), now->text, now->after, now->needed}},
+                    number_base::decimal);
+    }
 }
 
 TEST(extra_info, every_other_tag_ends_the_block_with_a_dump_of_all_of_it) {

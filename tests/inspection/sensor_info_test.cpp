@@ -23,26 +23,28 @@ TEST_F(sensor_info, sensors_of_every_kind_that_answer_everything) {
 
 TEST_F(sensor_info, a_sensor_that_answers_its_interval_alone) {
     put_service(host, "als", 1).set_report(0, words({20'000}));
+    const std::string summary =
+        "Sensor type : als\n"
+        "Device      :  \n"
+        "Location    : N/A\n"
+        "Sample intvl: 20000 us, hw=-1 decimation=disabled\n"
+        "Systck intvl: sensor is not systick source\n"
+        "Batching    : sensor=0 mux=0 ap_batch=0 ap_report=0 (0 samples in endpoint)\n"
+        "Sensor mode : normal\n"
+        "Filter      : disabled fixedOdr=disabled\n"
+        "Calibrated  : uncalibrated\n"
+        "SampleRates : \n"
+        "StartupTime : 0\n"
+        "intCal      : 0 [at 100Hz]\n";
+    EXPECT_EQ(inspect("als", 1).out, summary + "\n\n");
     const outcome result = inspect("als", 2);
-    EXPECT_EQ(result.out,
-              "Sensor type : als\n"
-              "Device      :  \n"
-              "Location    : N/A\n"
-              "Sample intvl: 20000 us, hw=-1 decimation=disabled\n"
-              "Systck intvl: sensor is not systick source\n"
-              "Batching    : sensor=0 mux=0 ap_batch=0 ap_report=0 (0 samples in endpoint)\n"
-              "Sensor mode : normal\n"
-              "Filter      : disabled fixedOdr=disabled\n"
-              "Calibrated  : uncalibrated\n"
-              "SampleRates : \n"
-              "StartupTime : 0\n"
-              "intCal      : 0 [at 100Hz]\n"
-              "ExtraInfo   : \n"
-              "ExtraInfo   : \n"
-              "ExtraInfo   : \n"
-              "ExtraInfo   : \n"
-              "SensorRegs  : <not supperted>\n"
-              "APPerfmon   : perfmon is not supported\n\n\n");
+    EXPECT_EQ(result.out, summary +
+                              "ExtraInfo   : \n"
+                              "ExtraInfo   : \n"
+                              "ExtraInfo   : \n"
+                              "ExtraInfo   : \n"
+                              "SensorRegs  : <not supperted>\n"
+                              "APPerfmon   : perfmon is not supported\n\n\n");
     EXPECT_EQ(result.err,
               failure_line("nrxtoollib", "child", "nrxctl/inspection/event_statistics.cpp"));
 }

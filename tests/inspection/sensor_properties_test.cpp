@@ -13,17 +13,34 @@ const std::string matrix =
     "0.000015 32767.999985 -32768.000000";
 const std::string batching =
     "sensor=-110000 mux=-120000 ap_batch=-130000 ap_report=-140000 (-150000 samples in endpoint)";
+const std::string not_batching = "sensor=0 mux=0 ap_batch=0 ap_report=0 (0 samples in endpoint)";
 const std::string orientation = "Orient. m.  : 1 -1 0, 0 127 -128, 2 3 4\n";
 const std::string rates = "100.00 200.00 333333.33 ";
 
 TEST_F(sensor_properties, that_are_not_read_show_a_failure_value_or_have_no_line) {
+    for (const char* name : {"accel", "gyro", "compass"}) {
+        expect_changes(name, {
+                                 {0x33, {}, "hw=-250000", "hw=-1"},
+                                 {0x40, {}, "125000 us", "sensor is not systick source"},
+                                 {0x22, {}, "enabled fixedOdr", "disabled fixedOdr"},
+                                 {0x23, {}, "fixedOdr=disabled", "fixedOdr=disabled"},
+                                 {0x24, {}, "decimation=enabled", "decimation=disabled"},
+                                 {0x43, {}, batching, not_batching},
+                                 {0x0a, {}, "factory", "factory"},
+                                 {0x0d, {}, "factory", "normal"},
+                                 {0x0f, {}, "Maker M-1", " M-1"},
+                                 {0x10, {}, "Maker M-1", "Maker "},
+                                 {0x0b, {}, "Cal matrix  : " + matrix + "\n", ""},
+                                 {0x1a, {}, "Cal offset  : 1 -2 2147483647\n", ""},
+                                 {0x18, {}, orientation, ""},
+                                 {0x3f, {}, rates, ""},
+                                 {0x2d, {}, "-210000", "0"},
+                                 {0x19, {}, "-220000", "0"},
+                                 {0x3d, {}, "sysconfig", "uncalibrated"},
+                                 {0x44, {}, "'L' alternate=-65536", "N/A"},
+                             });
+    }
     expect_changes("accel", {
-                                {0x33, {}, "hw=-250000", "hw=-1"},
-                                {0x0b, {}, "Cal matrix  : " + matrix + "\n", ""},
-                                {0x1a, {}, "Cal offset  : 1 -2 2147483647\n", ""},
-                                {0x18, {}, orientation, ""},
-                                {0x3f, {}, rates, ""},
-                                {0x44, {}, "'L' alternate=-65536", "N/A"},
                                 {0x06, {}, "fsr         : -80000", "fsr         : "},
                                 {0x36, {}, "2 70000 -8 ", ""},
                                 {0x04, {}, "bw          : -1", "bw          : "},

@@ -84,7 +84,8 @@ TEST(profiler_fault_sweep, subcommands_report_every_failure_that_is_no_probe) {
 
 TEST(profiler_fault_sweep, monitors_report_end_and_leave_nothing_open) {
     nrx::tick_period = platform::tick_period();
-    sweep(nrx::profile_command, "40 sensor:accel", is_reported_or_foreseen);
+    for (const char* words : {"40 sensor:accel", "monitor human 40"})
+        sweep(nrx::profile_command, words, is_reported_or_foreseen);
     sweep(nrx::scm_monitor, "40 scm:spi0:ch0", is_reported_or_foreseen);
 }
 

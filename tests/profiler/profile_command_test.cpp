@@ -2,6 +2,7 @@
 
 #include <csignal>
 
+#include "nrxctl/decoders/record_text.h"
 #include "tests/profiler/profiler_host.h"
 
 namespace tests {
@@ -250,6 +251,29 @@ TEST_F(profile_command, subcommands_take_their_own_words_and_no_other) {
     EXPECT_EQ(profile("on-error Panic").out, "invalid argument: Panic\n");
     EXPECT_EQ(profile("on-error").out, "invalid argument: \n");
     EXPECT_TRUE(happened().empty());
+}
+
+TEST_F(profile_command, monitor_prints_what_comes_and_changes_nothing) {
+    put_both_halves();
+    nrx::profile_record record{};
+    record.bytes.fill(1);
+    record.bytes[0] = 3;
+    const std::string text = capture([&] { nrx::print_profile_record(record); }).out;
+    for (const auto& [words, duration, out] : rows<std::string, std::string, std::string>{
+             {"monitor", "00 00 00 00",
+              "duration=0 us mode=auto (humanReadable=disabled)\n" + dumped(3, 1)},
+             {"monitor human 250", "90 d0 03 00",
+              "duration=250000 us mode=enable (humanReadable=enabled)\n" + text},
+         }) {
+        driver->queue->add(record_bytes(3, 1));
+        driver->queue->add(record_bytes(0, 0));
+        const std::ptrdiff_t before = std::ssize(logged("call"));
+        says(words, out + "done\n");
+        const lines calls = logged("call");
+        EXPECT_EQ(lines(calls.begin() + before, calls.end()),
+                  (lines{"call profile 1 scalars [0xd2] in [" + duration + "] results 0 room 0",
+                         "call profile 2 scalars [0xd1] in [] results 0 room 65536"}));
+    }
 }
 
 TEST_F(profile_command, run_configures_enables_monitors_and_puts_everything_back) {

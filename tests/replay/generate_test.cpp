@@ -1,10 +1,14 @@
 // Generated signals.
 #include <algorithm>
+#include <array>
+#include <cstdio>
 #include <cstdlib>
 #include <ctime>
 #include <sstream>
 
+#include "nrxctl/base/little_endian.h"
 #include "nrxctl/replay/make_event.h"
+#include "nrxctl/replay/sample_file.h"
 #include "tests/replay/replay_host.h"
 #include "tests/support/word_vector.h"
 
@@ -152,6 +156,31 @@ TEST_F(generate, a_generator_begins_anew_when_it_is_prepared) {
     EXPECT_TRUE(event->init_generator("delta"));
     EXPECT_EQ(event->generate("delta", 7, 2), first);
     EXPECT_EQ(event->generate("other", 7, 2) + "\n", sample("accel", "00000000", 1, 7));
+}
+
+TEST_F(generate, every_signal_loads_back_as_it_was_written) {
+    for (const std::string tag : {"accel", "gyro", "compass"}) {
+        for (const std::string signal : {"random", "delta", "step", "sin"}) {
+            const auto generated = run({tag, signal, "250", "8hz"});
+            std::string values;
+            const auto loaded = capture([&] {
+                const auto groups = nrx::read_sample_file(sample_text_file(generated.out).path());
+                ASSERT_TRUE(groups && groups->size() == 1 && groups->contains(tag));
+                std::uint64_t timestamp = 0;
+                for (const auto& event : groups->at(tag)) {
+                    std::array<char, 10> x{};
+                    std::snprintf(x.data(), x.size(), "%08x ",
+                                  nrx::load_le<std::uint32_t>(event->data() + 16));
+                    values += x.data();
+                    EXPECT_EQ(event->timestamp(), timestamp);
+                    timestamp += 250;
+                }
+            });
+            EXPECT_EQ(values.size(), 500U * 9);
+            EXPECT_EQ(values, values_of(generated));
+            EXPECT_EQ(loaded.out + loaded.err, "") << tag << " " << signal;
+        }
+    }
 }
 
 }  // namespace tests
