@@ -39,7 +39,7 @@
 #include "nrxctl/inspection/sensor_info.h"
 
 // HID events and SPI status records as they arrive
-#include "nrxctl/inspection/hid_event_times.h"
+#include "nrxctl/inspection/clock_references.h"
 #include "nrxctl/inspection/hid_event_watch.h"
 #include "nrxctl/inspection/hid_events.h"
 #include "nrxctl/inspection/hid_statistics.h"

@@ -14,10 +14,10 @@ platform::return_code open_channel(platform::service found, std::uint32_t type, 
     return open_connection(opened.service, type, opened.connect);
 }
 
-platform::return_code open_channel(std::string_view service_name, missing_service missing,
-                                   channel& opened) {
+platform::return_code open_channel(std::string_view service_name, channel& opened,
+                                   expected_failure missing) {
     platform::service found = find_service(service_name);
-    if (!found && missing == missing_service::is_silent) return platform::not_found;
+    if (!found && missing == expected_failure::is_silent) return platform::not_found;
     return open_channel(std::move(found), 0, opened);
 }
 

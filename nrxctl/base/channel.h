@@ -4,6 +4,7 @@
 #include <cstdint>
 #include <string_view>
 
+#include "nrxctl/base/failure_report.h"
 #include "platform/connection.h"
 #include "platform/registry.h"
 
@@ -21,11 +22,9 @@ struct channel {
 // connection.
 platform::return_code open_channel(platform::service found, std::uint32_t type, channel& opened);
 
-enum class missing_service { is_reported, is_silent };
-
 // Finds a service by name and opens a connection of type 0 on it. Fails as the above does, but for
 // a missing service silently if so asked.
-platform::return_code open_channel(std::string_view service_name, missing_service missing,
-                                   channel& opened);
+platform::return_code open_channel(std::string_view service_name, channel& opened,
+                                   expected_failure missing = expected_failure::is_reported);
 
 }  // namespace nrx

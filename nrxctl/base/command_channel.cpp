@@ -46,7 +46,7 @@ void announce_unsupported(std::uint32_t command, platform::byte_view payload) {
 platform::return_code get_report(std::string_view service_name, std::uint32_t report_id,
                                  platform::byte_span& report) {
     channel from;
-    const auto opened = open_channel(service_name, missing_service::is_reported, from);
+    const auto opened = open_channel(service_name, from);
     if (opened != platform::success) return opened;
     const auto kr = read_report(from, report_id, report);
     check_success(kr, "kr == 0 ");
@@ -56,14 +56,14 @@ platform::return_code get_report(std::string_view service_name, std::uint32_t re
 platform::return_code get_report_quiet(std::string_view service_name, std::uint32_t report_id,
                                        platform::byte_span& report) {
     channel from;
-    const auto opened = open_channel(service_name, missing_service::is_silent, from);
+    const auto opened = open_channel(service_name, from, expected_failure::is_silent);
     return opened == platform::success ? read_report(from, report_id, report) : opened;
 }
 
 platform::return_code set_report(std::string_view service_name, std::uint32_t report_id,
                                  platform::byte_view report) {
     channel to;
-    const auto opened = open_channel(service_name, missing_service::is_reported, to);
+    const auto opened = open_channel(service_name, to);
     if (opened != platform::success) return opened;
     platform::byte_span no_response;
     const auto kr = call_with_id(to, write_report_selector, report_id, report, no_response);
@@ -73,12 +73,12 @@ platform::return_code set_report(std::string_view service_name, std::uint32_t re
 
 platform::return_code send_command(std::string_view service_name, std::uint32_t command,
                                    platform::byte_view payload, platform::byte_span& response,
-                                   command_failure failure) {
+                                   expected_failure failure) {
     channel to;
-    const auto opened = open_channel(service_name, missing_service::is_reported, to);
+    const auto opened = open_channel(service_name, to);
     if (opened != platform::success) return opened;
     const auto kr = call_with_id(to, command_selector, command, payload, response);
-    if (failure == command_failure::is_silent) return kr;
+    if (failure == expected_failure::is_silent) return kr;
     if (kr == platform::unsupported) announce_unsupported(command, payload);
     check_success(kr, "kr == 0 ");
     return kr;

@@ -9,6 +9,7 @@
 #include <cstdint>
 #include <string_view>
 
+#include "nrxctl/base/failure_report.h"
 #include "platform/bytes.h"
 #include "platform/return_code.h"
 
@@ -27,14 +28,12 @@ platform::return_code get_report_quiet(std::string_view service_name, std::uint3
 platform::return_code set_report(std::string_view service_name, std::uint32_t report_id,
                                  platform::byte_view report);
 
-enum class command_failure { is_reported, is_silent };
-
 // Sends a command with a payload, which may be empty. The response, if any is wanted, goes into the
 // room that response gives, which is cut to what came back. A command that the driver does not
 // support is also announced on standard output, with a dump of its payload. Silence is about the
 // call alone: a missing service and a failed open are reported all the same.
 platform::return_code send_command(std::string_view service_name, std::uint32_t command,
                                    platform::byte_view payload, platform::byte_span& response,
-                                   command_failure failure = command_failure::is_reported);
+                                   expected_failure failure = expected_failure::is_reported);
 
 }  // namespace nrx

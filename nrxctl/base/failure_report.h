@@ -36,4 +36,8 @@ inline bool check_success(platform::return_code code, const char* text,
     return check_as(library_label, code == platform::success, text, code, place);
 }
 
+// What an operation does about the one failure that its caller may foresee, such as a service that
+// is not there.
+enum class expected_failure { is_reported, is_silent };
+
 }  // namespace nrx

@@ -4,6 +4,7 @@
 #include <array>
 #include <cstddef>
 
+#include "nrxctl/base/hex_digits.h"
 #include "nrxctl/base/output.h"
 
 namespace nrx {
@@ -12,7 +13,6 @@ namespace {
 
 constexpr std::size_t bytes_per_line = 16;
 constexpr std::size_t bytes_before_gap = 8;
-constexpr std::string_view hex_digits = "0123456789abcdef";
 constexpr std::string_view separator = " | ";
 
 // Label and blank, "oooooooo: ", the pairs and their gap, the separator, the characters and their

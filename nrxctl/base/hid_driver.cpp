@@ -1,10 +1,10 @@
 #include "nrxctl/base/hid_driver.h"
 
 #include <cstdint>
-#include <string>
 
 #include "nrxctl/base/channel.h"
 #include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/matching.h"
 #include "platform/connection.h"
 #include "platform/registry.h"
 
@@ -17,8 +17,9 @@ constexpr std::uint32_t structure_selector = 0;
 
 platform::dictionary match_hid_driver() {
     constexpr std::int32_t location = 1234;
-    return {{std::string(platform::name_match_key), "KeltoNRXHIDDriver"},
-            {std::string(platform::location_id_key), location}};
+    platform::dictionary matching = match_name("KeltoNRXHIDDriver");
+    matching.set(platform::location_id_key, location);
+    return matching;
 }
 
 }  // namespace

@@ -4,6 +4,7 @@
 #include <concepts>
 #include <cstddef>
 #include <cstdint>
+#include <initializer_list>
 #include <type_traits>
 #include <vector>
 
@@ -34,6 +35,13 @@ inline void append_le(std::vector<std::uint8_t>& bytes, std::uint64_t value, std
     for (std::size_t i = 0; i < width; ++i) {
         bytes.push_back(static_cast<std::uint8_t>(value >> (8 * i)));
     }
+}
+
+// Appends numbers of 32 bits likewise.
+inline void append_words(std::vector<std::uint8_t>& bytes,
+                         std::initializer_list<std::uint32_t> words) {
+    for (const std::uint32_t word : words)
+        append_le(bytes, word, sizeof(word));
 }
 
 }  // namespace nrx

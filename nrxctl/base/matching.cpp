@@ -18,6 +18,16 @@ platform::dictionary match_service_name(std::string_view name) {
     return matching;
 }
 
+platform::dictionary match_name(std::string_view name) {
+    return {{std::string(platform::name_match_key), name}};
+}
+
+platform::dictionary match_hid_device(const platform::property& location) {
+    platform::dictionary matching = platform::matching_class(hid_device_class);
+    matching.set(platform::location_id_key, location);
+    return matching;
+}
+
 platform::dictionary usage_pair(std::int32_t page, std::int32_t usage) {
     return {{std::string(platform::usage_page_key), page},
             {std::string(platform::usage_key), usage}};

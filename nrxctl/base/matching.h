@@ -19,6 +19,12 @@ inline constexpr std::string_view service_id_key = "service_id";
 platform::dictionary match_service_id(std::int32_t id);
 platform::dictionary match_service_name(std::string_view name);
 
+// Whatever has a registry name, of any class.
+platform::dictionary match_name(std::string_view name);
+
+// The HID device at a location, which is the id of its interface service.
+platform::dictionary match_hid_device(const platform::property& location);
+
 // One usage of a HID device: {"DeviceUsagePage": page, "DeviceUsage": usage}.
 platform::dictionary usage_pair(std::int32_t page, std::int32_t usage);
 

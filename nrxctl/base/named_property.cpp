@@ -26,7 +26,7 @@ platform::return_code set_named_property(std::string_view service_name,
                                          std::string_view property_name,
                                          platform::byte_view value) {
     channel to;
-    const auto opened = open_channel(service_name, missing_service::is_reported, to);
+    const auto opened = open_channel(service_name, to);
     if (opened != platform::success) return opened;
     // The name with its NUL, then the value.
     const std::size_t name_size = property_name.size() + 1;
@@ -48,7 +48,7 @@ platform::return_code get_named_property(std::string_view service_name,
                                          std::string_view property_name,
                                          platform::byte_span& value) {
     channel from;
-    const auto opened = open_channel(service_name, missing_service::is_reported, from);
+    const auto opened = open_channel(service_name, from);
     if (opened != platform::success) return opened;
     std::vector<std::uint8_t> name(property_name.begin(), property_name.end());
     name.push_back(0);

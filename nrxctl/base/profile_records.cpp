@@ -6,6 +6,7 @@
 
 #include "nrxctl/base/command_channel.h"
 #include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/whole_records.h"
 
 namespace nrx {
 
@@ -18,12 +19,11 @@ constexpr int most_reads = 10;
 }  // namespace
 
 void print_whole_records(platform::byte_view records, record_printer print) {
-    while (records.size() >= profile_record_size) {
+    for_each_record(records, profile_record_size, [&](platform::byte_view bytes) {
         profile_record record;
-        std::copy_n(records.begin(), profile_record_size, record.bytes.begin());
+        std::copy(bytes.begin(), bytes.end(), record.bytes.begin());
         print(record);
-        records = records.subspan(profile_record_size);
-    }
+    });
 }
 
 void read_profile_records(record_printer print) {

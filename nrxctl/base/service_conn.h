@@ -4,6 +4,7 @@
 #include <string>
 #include <utility>
 
+#include "nrxctl/base/failure_report.h"
 #include "platform/connection.h"
 #include "platform/registry.h"
 
@@ -23,8 +24,8 @@ public:
 
     // Finds the service by its bare registry name, of whatever class, takes its first child and
     // opens a connection of type 0 on that. Whether the connection is open; if not, the check that
-    // failed is reported, except that a missing service is not when quiet.
-    bool open(bool quiet);
+    // failed is reported, a missing service unless so asked.
+    bool open(expected_failure missing = expected_failure::is_reported);
 
     // The connection; none before a successful open.
     [[nodiscard]] const platform::connection& connection() const { return connection_; }

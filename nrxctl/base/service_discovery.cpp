@@ -35,12 +35,6 @@ std::optional<std::int32_t> service_id_of(const platform::service& service) {
     return id ? narrow_id(id->number()) : std::nullopt;
 }
 
-platform::service find_hid_device_at(const platform::property& location) {
-    platform::dictionary matching = platform::matching_class(hid_device_class);
-    matching.set(platform::location_id_key, location);
-    return platform::first_match(matching);
-}
-
 }  // namespace
 
 std::string prefixed_name(std::string_view name) {
@@ -69,12 +63,12 @@ bool service_exists(std::string_view name) {
 platform::service find_hid_device(std::string_view name) {
     if (is_service_id(name)) {
         const auto location = read_service_id(name);
-        return location ? find_hid_device_at(*location) : platform::service();
+        return location ? platform::first_match(match_hid_device(*location)) : platform::service();
     }
     const platform::service nrx_interface = find_service(name);
     if (!check(nrx_interface, "nrx_interface")) return {};
     const auto location = platform::read_property(nrx_interface, service_id_key);
-    return location ? find_hid_device_at(*location) : platform::service();
+    return location ? platform::first_match(match_hid_device(*location)) : platform::service();
 }
 
 bool resolve_service_id(std::string_view name, std::int32_t& id) {

@@ -10,6 +10,9 @@
 
 namespace nrx {
 
+// The base in which numbers are written.
+enum class number_base { decimal, hexadecimal };
+
 class text_line {
 public:
     text_line& text(std::string_view text) {

@@ -5,6 +5,7 @@
 #include <cstddef>
 #include <cstdlib>
 
+#include "nrxctl/base/hex_digits.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/source_place.h"
 #include "nrxctl/base/text_line.h"
@@ -14,7 +15,6 @@ namespace nrx {
 namespace {
 
 constexpr std::size_t line_room = 256;
-constexpr std::string_view hex_digits = "0123456789abcdef";
 
 // Stops the process in the way of the host's assertions, whatever the build.
 [[noreturn]] void stop(std::string_view function, std::string_view expression,

@@ -5,13 +5,12 @@
 #include <bit>
 #include <charconv>
 #include <cstring>
-#include <string_view>
+
+#include "nrxctl/base/hex_digits.h"
 
 namespace nrx {
 
 namespace {
-
-constexpr std::string_view digit_characters = "0123456789abcdef";
 
 // Eight characters of text in a number, the first in the lowest byte; so they are made, shortened
 // and written without a loop or a branch.
@@ -51,8 +50,7 @@ std::size_t leading_zeros(std::uint64_t digits) {
 constexpr auto hex_pairs = [] {
     std::array<std::uint16_t, 256> table{};
     for (std::size_t i = 0; i < table.size(); ++i) {
-        table[i] =
-            static_cast<std::uint16_t>(digit_characters[i / 16] | digit_characters[i % 16] << 8);
+        table[i] = static_cast<std::uint16_t>(hex_digits[i / 16] | hex_digits[i % 16] << 8);
     }
     return table;
 }();
@@ -75,7 +73,7 @@ constexpr auto byte_texts = [] {
         byte_text& entry = table[value];
         for (std::size_t power = 100; power > 0; power /= 10) {
             if (value < power && power > 1) continue;
-            entry.text[entry.size++] = digit_characters[value / power % 10];
+            entry.text[entry.size++] = hex_digits[value / power % 10];
         }
         entry.text[entry.size++] = ',';
     }

@@ -9,6 +9,7 @@
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/whole_records.h"
 
 namespace nrx {
 
@@ -48,15 +49,15 @@ void print_client_table(std::string_view label, std::string_view service_name) {
     std::array<std::uint8_t, most_entries * entry_size> room{};
     platform::byte_span entries = room;
     const auto kr =
-        send_command(service_name, client_command, {}, entries, command_failure::is_silent);
+        send_command(service_name, client_command, {}, entries, expected_failure::is_silent);
     if (kr == platform::success) print_clients(label, entries);
 }
 
 void print_clients(std::string_view label, platform::byte_view entries) {
     print_line(text_line().text(label).text(heading).view());
-    for (; entries.size() >= entry_size; entries = entries.subspan(entry_size)) {
-        if (entries[in_use_offset] != 0) print_client(label, entries.first(entry_size));
-    }
+    for_each_record(entries, entry_size, [&](platform::byte_view entry) {
+        if (entry[in_use_offset] != 0) print_client(label, entry);
+    });
 }
 
 }  // namespace nrx

@@ -10,7 +10,6 @@
 #include "nrxctl/base/little_endian.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
-#include "nrxctl/base/text_line.h"
 #include "nrxctl/inspection/sensor_reports.h"
 
 namespace nrx {

@@ -3,6 +3,7 @@
 
 #include <string_view>
 
+#include "nrxctl/base/text_line.h"
 #include "platform/bytes.h"
 
 namespace nrx {
@@ -10,9 +11,6 @@ namespace nrx {
 // Reads and prints the four blocks of a sensor (reports 0x39 to 0x3c); one that is not read is
 // empty.
 void print_extra_info(std::string_view service_name);
-
-// The base in which numbers are written.
-enum class number_base { decimal, hexadecimal };
 
 // Prints the items of a block, after a label, without anything between them. A tag byte opens each:
 //   0  a 32-bit number   2  text, up to a NUL   4  numbers in hexadecimal from here on

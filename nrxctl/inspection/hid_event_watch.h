@@ -10,7 +10,7 @@ namespace nrx {
 
 // Prints HID events, reset notices and statistics updates as they arrive, from the event loop of
 // this thread: for so long, or until the loop is stopped. A front end has set the references of
-// hid_event_times.h and the tick period. Fails, with a failure report, with not_found if there is
+// clock_references.h and the tick period. Fails, with a failure report, with not_found if there is
 // no event system, else with the platform's code.
 platform::return_code watch_hid_events(std::optional<std::chrono::seconds> duration);
 

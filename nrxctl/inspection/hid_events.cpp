@@ -7,11 +7,16 @@
 
 #include "nrxctl/base/field_text.h"
 #include "nrxctl/base/tick_period.h"
+#include "nrxctl/inspection/clock_references.h"
 #include "nrxctl/inspection/event_stream.h"
 #include "nrxctl/inspection/hid_event_times.h"
 #include "platform/clock.h"
 
 namespace nrx {
+
+double first_event_time = 0;
+double last_event_time = 0;
+double last_wall_time = 0;
 
 namespace {
 

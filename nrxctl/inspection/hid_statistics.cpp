@@ -8,6 +8,7 @@
 
 #include "nrxctl/base/fixed_point.h"
 #include "nrxctl/base/reply_fields.h"
+#include "nrxctl/base/whole_records.h"
 #include "nrxctl/inspection/event_stream.h"
 #include "nrxctl/inspection/stats_key_names.h"
 
@@ -32,7 +33,8 @@ constexpr std::array operation_rows{
     operation_row{": push ", value_kind::fraction},
 };
 
-void print_record(const reply_fields& record) {
+void print_record(platform::byte_view bytes) {
+    const reply_fields record(bytes);
     const auto& row =
         operation_rows[std::min<std::size_t>(record.u8(1), operation_rows.size() - 1)];
     const std::int32_t value = record.s32(3);
@@ -47,9 +49,7 @@ void print_record(const reply_fields& record) {
 }  // namespace
 
 void stats_callback(platform::byte_view records) {
-    for (; records.size() >= record_size; records = records.subspan(record_size)) {
-        print_record(reply_fields(records.first(record_size)));
-    }
+    for_each_record(records, record_size, print_record);
 }
 
 }  // namespace nrx

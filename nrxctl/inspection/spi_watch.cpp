@@ -29,10 +29,8 @@ bool check_result(platform::return_code code, const char* message,
 }
 
 platform::service find_device_of(std::int32_t service_id) {
-    platform::dictionary matching = platform::matching_class(hid_device_class);
-    matching.set(platform::location_id_key, service_id);
     print_line(text_line().text("Found an id for service = ").number(service_id).view());
-    return platform::first_match(matching);
+    return platform::first_match(match_hid_device(service_id));
 }
 
 void print_records(const platform::hid_interface& device, std::int32_t service_id,

@@ -9,6 +9,7 @@
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/whole_records.h"
 #include "nrxctl/printers/field_table.h"
 
 namespace nrx {
@@ -64,12 +65,12 @@ void print_link_counters(platform::byte_view report) {
 void print_data_log(platform::byte_view report) {
     constexpr std::size_t record_size = 12;
     text_line line;
-    for (; report.size() >= record_size; report = report.subspan(record_size)) {
-        const reply_fields fields(report);
+    for_each_record(report, record_size, [&](platform::byte_view record) {
+        const reply_fields fields(record);
         line.clear();
         line.text("data:").hex(fields.u32(8), 2).text(" timestamp:").number(fields.u64(0));
         print_line(line.view());
-    }
+    });
 }
 
 // Which layout a service's reports have.

@@ -30,16 +30,18 @@ constexpr std::array captured_types{captured_data{0, "MOSI"}, captured_data{1, "
 struct error_text {
     std::uint32_t code;
     std::string_view before;  // the value of the record stands between the two
-    bool is_hexadecimal;
+    number_base base;
     std::string_view after;
 };
 
 constexpr std::array error_texts{
-    error_text{0x7001, "errorStatus(0x", true, "), error: bad checksum"},
-    error_text{0x7002, "errorStatus(0x", true, "),  error: corrupted transport header"},
-    error_text{0x7003, "errorStatus(0x", true, "),  error:bad transport header status"},
-    error_text{0x7004, "errorStatus(0x", true, "),  error:spi read error"},
-    error_text{0x7005, "", false, " packet_drops observed"},
+    error_text{0x7001, "errorStatus(0x", number_base::hexadecimal, "), error: bad checksum"},
+    error_text{0x7002, "errorStatus(0x", number_base::hexadecimal,
+               "),  error: corrupted transport header"},
+    error_text{0x7003, "errorStatus(0x", number_base::hexadecimal,
+               "),  error:bad transport header status"},
+    error_text{0x7004, "errorStatus(0x", number_base::hexadecimal, "),  error:spi read error"},
+    error_text{0x7005, "", number_base::decimal, " packet_drops observed"},
 };
 
 text_line heading_of(const reply_fields& fields) {
@@ -51,7 +53,7 @@ void append_error(text_line& line, std::uint32_t code, std::uint32_t value) {
     for (const error_text& known : error_texts) {
         if (known.code != code) continue;
         line.text(known.before);
-        if (known.is_hexadecimal) {
+        if (known.base == number_base::hexadecimal) {
             line.hex(value);
         } else {
             line.number(static_cast<std::int32_t>(value));

@@ -6,6 +6,7 @@
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/whole_records.h"
 
 namespace nrx {
 
@@ -30,9 +31,7 @@ void print_record(platform::byte_view record) {
 
 void print_transfer_errors(std::string_view /*service_name*/, std::int32_t /*report_id*/,
                            platform::byte_view report) {
-    for (; report.size() >= record_size; report = report.subspan(record_size)) {
-        print_record(report.first(record_size));
-    }
+    for_each_record(report, record_size, print_record);
 }
 
 }  // namespace nrx

@@ -16,7 +16,7 @@ constexpr std::string_view kernel_refusal = "kext config: At least one config fa
 // The driver's answer; none if there is no connection to ask on.
 std::optional<platform::return_code> send_to_kernel(std::span<const profiler_config> configs) {
     profiler_conn conn;
-    if (!conn.open(presence::is_required)) return std::nullopt;
+    if (!conn.open()) return std::nullopt;
     const auto records = encode_configs(configs);
     platform::call_outputs nothing;
     return platform::call(conn.connection(), profiler_method::configure, {{}, records}, nothing);

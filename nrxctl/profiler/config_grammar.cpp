@@ -5,6 +5,7 @@
 
 #include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/numbers.h"
+#include "nrxctl/base/word_table.h"
 #include "nrxctl/profiler/split.h"
 
 namespace nrx {
@@ -30,7 +31,7 @@ std::uint32_t parse_reports(std::span<const word_number> table, const word_list&
     std::uint32_t mask = 0;
     for (const std::string_view word : words) {
         if (word == stop_word) continue;
-        const word_number* known = find_word(table, word);
+        const word_number* known = find_word_row(table, word);
         mask |= known == nullptr ? parse_u32(word, "report mask is invalid") : known->number;
     }
     return mask;
@@ -85,7 +86,7 @@ bool init_profiler_config(const profiler_grammar& profiler, std::string_view com
         config.state = profiler_state::stop;
         return true;
     }
-    const word_number* known = find_word(profiler.components, component);
+    const word_number* known = find_word_row(profiler.components, component);
     const bool enable_num_components = profiler.takes_numeric_components;
     if (known == nullptr && !check(enable_num_components, "enable_num_components")) return false;
     config.component =

@@ -162,8 +162,4 @@ const report_grammar* reports_of(const profiler_grammar& profiler, std::string_v
     return special == nullptr ? profiler.reports : &special->reports;
 }
 
-const word_number* find_word(std::span<const word_number> table, std::string_view word) {
-    return find_word_row(table, word);
-}
-
 }  // namespace nrx

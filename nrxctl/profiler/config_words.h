@@ -41,7 +41,4 @@ const profiler_grammar* find_profiler_grammar(std::string_view word);
 // The reports that may follow a component word; null if no report list is read.
 const report_grammar* reports_of(const profiler_grammar& profiler, std::string_view component);
 
-// The row of a word; null if there is none.
-const word_number* find_word(std::span<const word_number> table, std::string_view word);
-
 }  // namespace nrx

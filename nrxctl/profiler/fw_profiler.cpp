@@ -37,14 +37,13 @@ platform::return_code send(std::uint32_t command) {
 platform::return_code send_statistics(std::uint32_t kind, std::uint32_t action,
                                       platform::byte_span& reply) {
     std::vector<std::uint8_t> payload;
-    append_le(payload, kind, sizeof(kind));
-    append_le(payload, action, sizeof(action));
+    append_words(payload, {kind, action});
     return send_command(profile_service, statistics_command, payload, reply);
 }
 
 platform::return_code write_number(std::uint32_t report_id, std::uint32_t number) {
     std::vector<std::uint8_t> report;
-    append_le(report, number, sizeof(number));
+    append_words(report, {number});
     return set_report(profile_service, report_id, report);
 }
 
@@ -58,7 +57,7 @@ platform::return_code send_fw_configs(std::span<const profiler_config> configs) 
     if (!fw_profiler_available()) return platform::success;
     platform::byte_span no_reply;
     return send_command(profile_service, configure_command, encode_configs(configs), no_reply,
-                        command_failure::is_silent);
+                        expected_failure::is_silent);
 }
 
 std::vector<profiler_config> read_fw_configs() {

@@ -21,7 +21,7 @@ platform::return_code call_without_arguments(const profiler_conn& conn, std::uin
 
 bool set_profiler_enabled(bool enable) {
     profiler_conn conn;
-    const bool success = conn.open(presence::is_required);
+    const bool success = conn.open();
     if (!check(success, "success")) return false;
     const std::array<std::uint64_t, 1> scalars{enable ? 1U : 0U};
     platform::call_outputs nothing;
@@ -32,7 +32,7 @@ bool set_profiler_enabled(bool enable) {
 
 bool get_profiler_status(bool& connected) {
     profiler_conn conn;
-    const bool success = conn.open(presence::is_required);
+    const bool success = conn.open();
     if (!check(success, "success")) return false;
     std::array<std::uint64_t, 1> status{0};
     platform::call_outputs outputs{status, {}};
@@ -54,7 +54,7 @@ std::vector<profiler_config> read_kernel_configs(const profiler_conn& conn) {
 
 void read_profiler_log(record_printer print, stored_records which) {
     profiler_conn conn;
-    if (!conn.open(presence::is_optional)) return;
+    if (!conn.open(expected_failure::is_silent)) return;
     std::vector<std::uint8_t> buffer(log_capacity);
     for (int read = 0; read < most_reads; ++read) {
         platform::call_outputs outputs{{}, buffer};
@@ -68,14 +68,14 @@ void read_profiler_log(record_printer print, stored_records which) {
 
 void make_error_dump() {
     profiler_conn conn;
-    if (!conn.open(presence::is_optional)) return;
+    if (!conn.open(expected_failure::is_silent)) return;
     const platform::return_code kr = call_without_arguments(conn, profiler_method::make_error_dump);
     check_success(kr, "kr == 0 ");
 }
 
 void stop_on_interrupt() {
     profiler_conn conn;
-    const bool success = conn.open(presence::is_required);
+    const bool success = conn.open();
     if (!check(success, "success")) return;
     const platform::return_code kr = call_without_arguments(conn, profiler_method::stop_monitor);
     check_success(kr, "kr == 0 ");

@@ -92,7 +92,7 @@ bool monitor_profiler(std::uint32_t duration, record_printer print) {
     profiler_conn conn;
     const std::uint64_t start = platform::ticks();
     const bool coprocessor_too = fw_profiler_available();
-    const bool success = conn.open_queue(presence::is_required);
+    const bool success = conn.open_queue();
     if (!check(success, "success")) return false;
     if (coprocessor_too) {
         const platform::return_code kr = set_monitor_duration(duration);

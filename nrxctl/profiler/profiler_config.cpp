@@ -1,6 +1,8 @@
 #include "nrxctl/profiler/profiler_config.h"
 
 #include "nrxctl/base/little_endian.h"
+#include "nrxctl/base/reply_fields.h"
+#include "nrxctl/base/whole_records.h"
 
 namespace nrx {
 
@@ -9,18 +11,15 @@ namespace {
 constexpr std::size_t word_size = sizeof(std::uint32_t);
 constexpr std::size_t services_offset = 16;
 
-void append_word(std::vector<std::uint8_t>& bytes, std::uint32_t word) {
-    append_le(bytes, word, word_size);
-}
-
-profiler_config decode_config(const std::uint8_t* record) {
+profiler_config decode_config(platform::byte_view record) {
+    const reply_fields fields(record);
     profiler_config config;
-    config.profiler = load_le<std::uint32_t>(record);
-    config.component = load_le<std::uint32_t>(record + 4);
-    config.state = profiler_state{load_le<std::uint32_t>(record + 8)};
-    config.reports = load_le<std::uint32_t>(record + 12);
+    config.profiler = fields.u32(0);
+    config.component = fields.u32(4);
+    config.state = profiler_state{fields.u32(8)};
+    config.reports = fields.u32(12);
     for (std::size_t i = 0; i < config.services.size(); ++i) {
-        config.services[i] = load_le<std::uint32_t>(record + services_offset + i * word_size);
+        config.services[i] = fields.u32(services_offset + i * word_size);
     }
     return config;
 }
@@ -50,23 +49,19 @@ std::vector<std::uint8_t> encode_configs(std::span<const profiler_config> config
     std::vector<std::uint8_t> bytes;
     bytes.reserve(configs.size() * profiler_config::wire_size);
     for (const profiler_config& config : configs) {
-        append_word(bytes, config.profiler);
-        append_word(bytes, config.component);
-        append_word(bytes, static_cast<std::uint32_t>(config.state));
-        append_word(bytes, config.reports);
+        append_words(bytes, {config.profiler, config.component,
+                             static_cast<std::uint32_t>(config.state), config.reports});
         for (const std::uint32_t service : config.services)
-            append_word(bytes, service);
-        append_word(bytes, 0);
+            append_words(bytes, {service});
+        append_words(bytes, {0});
     }
     return bytes;
 }
 
 std::vector<profiler_config> decode_configs(platform::byte_view reply) {
     std::vector<profiler_config> configs;
-    for (; reply.size() >= profiler_config::wire_size;
-         reply = reply.subspan(profiler_config::wire_size)) {
-        configs.push_back(decode_config(reply.data()));
-    }
+    for_each_record(reply, profiler_config::wire_size,
+                    [&](platform::byte_view record) { configs.push_back(decode_config(record)); });
     return configs;
 }
 

@@ -1,6 +1,7 @@
 #include "nrxctl/profiler/profiler_conn.h"
 
 #include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/matching.h"
 #include "nrxctl/base/open_connection.h"
 
 namespace nrx {
@@ -12,18 +13,18 @@ constexpr std::uint32_t event_notification = 0;
 
 }  // namespace
 
-bool profiler_conn::open(presence driver) {
-    service_ = platform::first_match({{std::string(platform::name_match_key), name_}});
-    if (!service_ && driver == presence::is_optional) return false;
+bool profiler_conn::open(expected_failure missing) {
+    service_ = platform::first_match(match_name(name_));
+    if (!service_ && missing == expected_failure::is_silent) return false;
     if (!check(service_, "service")) return false;
     return open_connection(service_, 0, connection_) == platform::success;
 }
 
-bool profiler_conn::open_queue(presence mapping) {
-    const bool success = open(presence::is_required);
+bool profiler_conn::open_queue(expected_failure mapping) {
+    const bool success = open();
     if (!check(success, "success")) return false;
     platform::return_code kr = platform::map_memory(connection_, event_queue_memory, queue_);
-    if (!queue_ && mapping == presence::is_optional) return false;
+    if (!queue_ && mapping == expected_failure::is_silent) return false;
     if (!check_success(kr, "kr == 0 ")) return false;
     if (!check(queue_, "queue")) return false;
     port_ = platform::allocate_port();

@@ -25,9 +25,6 @@ inline constexpr std::uint32_t stop_monitor = 11;     // nothing in or out
 
 }  // namespace profiler_method
 
-// Whether something missing is a failure, to be reported, or the silent end of what was to be done.
-enum class presence { is_required, is_optional };
-
 // Lives for one operation. The connection is opened on the driver's service itself. Destruction
 // unmaps the queue, gives the port back, then closes and releases.
 class profiler_conn final : public service_conn {
@@ -35,14 +32,14 @@ public:
     profiler_conn() : service_conn(std::string(profiler_driver_name)) {}
 
     // Finds the driver by its registry name and opens a connection of type 0 on it. Whether the
-    // connection is open; if not, the check that failed is reported, except that a missing driver
-    // is not when it is optional.
-    bool open(presence driver);
+    // connection is open; if not, the check that failed is reported, a missing driver unless so
+    // asked.
+    bool open(expected_failure missing = expected_failure::is_reported);
 
     // Opens, maps the driver's event queue and attaches a port that is signalled when events
-    // arrive. Whether all of it stands; if not, the check that failed is reported, except that an
-    // optional mapping that fails, or succeeds and hands over no memory, is not.
-    bool open_queue(presence mapping);
+    // arrive. Whether all of it stands; if not, the check that failed is reported, a mapping that
+    // fails, or succeeds and hands over no memory, unless so asked.
+    bool open_queue(expected_failure mapping = expected_failure::is_reported);
 
     // None before a successful open_queue.
     [[nodiscard]] const platform::mapped_memory& queue() const { return queue_; }

@@ -50,7 +50,7 @@ void configure(argument_words& words) {
 
 void show_configs(argument_words& /*words*/) {
     profiler_conn conn;
-    bool success = conn.open(presence::is_required);
+    bool success = conn.open();
     if (!check(success, "success")) return;
     bool connected = false;
     success = get_profiler_status(connected);

@@ -6,9 +6,10 @@
 #include <string_view>
 
 #include "nrxctl/base/field_text.h"
-#include "nrxctl/base/little_endian.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
+#include "nrxctl/base/whole_records.h"
 
 namespace nrx {
 
@@ -20,19 +21,20 @@ constexpr std::size_t number_width = 10;
 constexpr std::size_t row_size = 64;
 constexpr std::size_t thread_size = 36;
 
-enum class base { hexadecimal, decimal };
-
 struct column {
     std::string_view heading;
     std::size_t offset;
-    base shown_in;
+    number_base base;
 };
 
 constexpr std::array columns{
-    column{"eventsource", 36, base::hexadecimal}, column{"function", 40, base::hexadecimal},
-    column{"context", 44, base::hexadecimal},     column{"count", 48, base::decimal},
-    column{"total_time", 52, base::decimal},      column{"max_time", 56, base::decimal},
-    column{"max_latency", 60, base::decimal},
+    column{"eventsource", 36, number_base::hexadecimal},
+    column{"function", 40, number_base::hexadecimal},
+    column{"context", 44, number_base::hexadecimal},
+    column{"count", 48, number_base::decimal},
+    column{"total_time", 52, number_base::decimal},
+    column{"max_time", 56, number_base::decimal},
+    column{"max_latency", 60, number_base::decimal},
 };
 
 // In the firmware's own spelling.
@@ -76,9 +78,9 @@ void print_row(platform::byte_view row) {
     text_line line;
     line.left(thread_of(row), name_width);
     for (const column& one : columns) {
-        const auto number = load_le<std::uint32_t>(row.data() + one.offset);
+        const std::uint32_t number = reply_fields(row).u32(one.offset);
         line.text(" ");
-        if (one.shown_in == base::hexadecimal) {
+        if (one.base == number_base::hexadecimal) {
             line.hex(number, number_width);
         } else {
             line.number(number, number_width);
@@ -95,8 +97,7 @@ void print_event_sources(platform::byte_view rows) {
     for (const column& one : columns)
         header.text(" ").left(one.heading, number_width);
     print_line(header.view());
-    for (; rows.size() >= row_size; rows = rows.subspan(row_size))
-        print_row(rows);
+    for_each_record(rows, row_size, print_row);
 }
 
 void print_wake_requests(platform::byte_view counts) {
@@ -106,7 +107,7 @@ void print_wake_requests(platform::byte_view counts) {
         if (counts.size() < count_size) return;
         text_line line;
         line.left(reason.substr(0, name_width), name_width).text(" ");
-        line.hex(load_le<std::uint32_t>(counts.data()), number_width).text(" ");
+        line.hex(reply_fields(counts).u32(0), number_width).text(" ");
         print_line(line.view());
         counts = counts.subspan(count_size);
     }

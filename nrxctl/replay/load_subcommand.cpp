@@ -97,10 +97,8 @@ std::vector<std::uint8_t> make_request(std::uint32_t service_id, const load_opti
         byte_count += event->size();
     std::vector<std::uint8_t> request;
     request.reserve(header_size + byte_count);
-    for (const std::uint32_t word : {service_id, options.completion, options.location,
-                                     options.filter, static_cast<std::uint32_t>(byte_count)}) {
-        append_le(request, word, sizeof(word));
-    }
+    append_words(request, {service_id, options.completion, options.location, options.filter,
+                           static_cast<std::uint32_t>(byte_count)});
     for (const event_ptr& event : events)
         request.insert(request.end(), event->data(), event->data() + event->size());
     return request;
@@ -113,7 +111,7 @@ progress upload(const load_options& options, const event_list& events) {
     if (!check(success, "success")) return progress::failed;
     const auto request = make_request(static_cast<std::uint32_t>(id), options, events);
     service_conn conn(replay_app::service_name);
-    success = conn.open(false);
+    success = conn.open();
     if (!check(success, "success")) return progress::failed;
     platform::call_outputs nothing;
     const platform::return_code kr =

@@ -5,7 +5,9 @@
 #include "nrxctl/base/command_channel.h"
 #include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/little_endian.h"
+#include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/service_discovery.h"
+#include "nrxctl/base/whole_records.h"
 #include "nrxctl/replay/replay_app.h"
 
 namespace nrx {
@@ -15,8 +17,7 @@ namespace {
 constexpr std::size_t most_entries = 32;
 
 void append_entry(std::vector<std::uint8_t>& report, const replay_state_entry& entry) {
-    for (const std::uint32_t word : {entry.service_id, entry.delay, entry.state})
-        append_le(report, word, sizeof(word));
+    append_words(report, {entry.service_id, entry.delay, entry.state});
 }
 
 }  // namespace
@@ -27,12 +28,10 @@ std::vector<replay_state_entry> replay_status() {
     const auto kr = get_report(replay_app::service_name, replay_app::state_report, report);
     if (kr != platform::success) return {};
     std::vector<replay_state_entry> entries;
-    for (; report.size() >= replay_state_entry::wire_size;
-         report = report.subspan(replay_state_entry::wire_size)) {
-        const std::uint8_t* words = report.data();
-        entries.push_back({load_le<std::uint32_t>(words), load_le<std::uint32_t>(words + 4),
-                           load_le<std::uint32_t>(words + 8)});
-    }
+    for_each_record(report, replay_state_entry::wire_size, [&](platform::byte_view entry) {
+        const reply_fields fields(entry);
+        entries.push_back({fields.u32(0), fields.u32(4), fields.u32(8)});
+    });
     return entries;
 }
 

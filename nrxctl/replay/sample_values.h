@@ -12,7 +12,7 @@ namespace nrx {
 // The keys that events read.
 enum class sample_key : std::uint8_t { sampleid, temperature, x, y, z, p, timestamp, shake };
 
-inline constexpr std::size_t sample_key_count = 8;
+inline constexpr std::size_t sample_key_count = static_cast<std::size_t>(sample_key::shake) + 1;
 
 // The key of that name; none if no event reads it.
 std::optional<sample_key> find_sample_key(std::string_view name);

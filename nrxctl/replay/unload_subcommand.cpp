@@ -24,7 +24,7 @@ void unload_service(const service_conn& conn, std::string_view service) {
         return;
     }
     std::vector<std::uint8_t> request;
-    append_le(request, static_cast<std::uint32_t>(id), sizeof(id));
+    append_words(request, {static_cast<std::uint32_t>(id)});
     platform::call_outputs nothing;
     const platform::return_code kr =
         platform::call(conn.connection(), replay_app::unload_method, {{}, request}, nothing);
@@ -38,7 +38,7 @@ void unload(argument_words& words) {
     if (!check(service, "argc > optind")) return;
     if (!replay_is_enabled()) return;
     service_conn conn(replay_app::service_name);
-    const bool success = conn.open(false);
+    const bool success = conn.open();
     if (!check(success, "success")) return;
     for (; service; service = words.take())
         unload_service(conn, *service);

@@ -53,20 +53,20 @@ TEST_F(command_channel, commands_may_have_neither_payload_nor_response) {
 }
 
 TEST_F(command_channel, announces_an_unsupported_command_with_its_payload_and_no_other) {
-    const auto sending = [&](platform::return_code expected, nrx::command_failure how) {
+    const auto sending = [&](platform::return_code expected, nrx::expected_failure how) {
         return capture([&] {
             EXPECT_EQ(nrx::send_command("accel", 0xab, byte_list{'h', 'i'}, none, how), expected);
         });
     };
-    const auto result = sending(platform::unsupported, nrx::command_failure::is_reported);
+    const auto result = sending(platform::unsupported, nrx::expected_failure::is_reported);
     EXPECT_EQ(result.out,
               "command 0xab is not supported for device\n"
               "payload 00000000: 68 69                                             | hi\n");
     EXPECT_EQ(result.err, unsupported_call);
-    const auto quiet = sending(platform::unsupported, nrx::command_failure::is_silent);
+    const auto quiet = sending(platform::unsupported, nrx::expected_failure::is_silent);
     EXPECT_EQ(quiet.out + quiet.err, "");
     host.remove("accel");
-    EXPECT_EQ(sending(platform::not_found, nrx::command_failure::is_silent).err,
+    EXPECT_EQ(sending(platform::not_found, nrx::expected_failure::is_silent).err,
               failed("base/channel.cpp", "service"));
 }
 

@@ -55,14 +55,14 @@ TEST(base_fault_sweep, channel_operations_connections_and_records) {
         {[] { nrx::switch_mca(true); }},
         {[] { nrx::switch_mca(false); }},
         {[] { nrx::read_profile_records([](const nrx::profile_record&) {}); }},
-        {[] { nrx::service_conn("NRXApp").open(false); },
+        {[] { nrx::service_conn("NRXApp").open(); },
          [](const fault& fault) { return !fault.result.err.empty(); }},
         // Probing reports a failed open and nothing else.
         {[] { nrx::get_report_quiet("accel", 0xd0, room()); },
          [](const fault& fault) {
              return fault.result.err.empty() != fault.name.starts_with("open ");
          }},
-        {[&] { nrx::send_command("31", 0x20, one, room(), nrx::command_failure::is_silent); },
+        {[&] { nrx::send_command("31", 0x20, one, room(), nrx::expected_failure::is_silent); },
          [](const fault& fault) {
              return fault.result.err.empty() == fault.name.starts_with("call ");
          }},

@@ -3,6 +3,7 @@
 #include <sstream>
 
 #include "nrxctl/base/tick_period.h"
+#include "nrxctl/inspection/clock_references.h"
 #include "nrxctl/inspection/hid_event_times.h"
 #include "nrxctl/inspection/hid_statistics.h"
 #include "platform/clock.h"

@@ -7,7 +7,7 @@
 
 namespace tests {
 
-using nrx::presence;
+using nrx::expected_failure;
 
 class profiler_operations : public profiler_test {
 protected:
@@ -19,37 +19,38 @@ protected:
     }
 };
 
-TEST_F(profiler_operations, connection_reports_what_is_missing_unless_it_is_optional) {
-    const auto opening = [](presence wanted, const std::string& reports) {
+TEST_F(profiler_operations, connection_reports_what_is_missing_unless_it_is_silent_about_it) {
+    const auto opening = [](expected_failure wanted, const std::string& reports) {
         EXPECT_EQ(tried([=] { return nrx::profiler_conn().open(wanted); }),
                   std::pair(false, reports));
     };
-    const auto mapping = [](presence wanted, const std::string& reports) {
+    const auto mapping = [](expected_failure wanted, const std::string& reports) {
         EXPECT_EQ(tried([=] { return nrx::profiler_conn().open_queue(wanted); }),
                   std::pair(false, reports));
     };
     const std::string broken = failed(conn_file, "kr == 0 ", io_text);
-    opening(presence::is_required, failed(conn_file, "service"));
-    opening(presence::is_optional, "");
-    mapping(presence::is_optional, failed(conn_file, "service") + failed(conn_file, "success"));
+    opening(expected_failure::is_reported, failed(conn_file, "service"));
+    opening(expected_failure::is_silent, "");
+    mapping(expected_failure::is_silent,
+            failed(conn_file, "service") + failed(conn_file, "success"));
 
     put_driver();
     host.fail_call(2, failure::io);
-    opening(presence::is_optional, broken);
+    opening(expected_failure::is_silent, broken);
     host.fail_call(2, failure::nothing);
-    opening(presence::is_required, failed(conn_file, "connect"));
+    opening(expected_failure::is_reported, failed(conn_file, "connect"));
     const auto queue = std::exchange(driver->queue, nullptr);
-    mapping(presence::is_required, failed(conn_file, "kr == 0 ", unsupported_text));
-    mapping(presence::is_optional, "");
+    mapping(expected_failure::is_reported, failed(conn_file, "kr == 0 ", unsupported_text));
+    mapping(expected_failure::is_silent, "");
     host.fail_call(3, failure::nothing);
-    mapping(presence::is_required, failed(conn_file, "queue"));
+    mapping(expected_failure::is_reported, failed(conn_file, "queue"));
     host.fail_call(3, failure::nothing);
-    mapping(presence::is_optional, "");
+    mapping(expected_failure::is_silent, "");
     driver->queue = queue;
     host.fail_call(4, failure::no_memory);
-    mapping(presence::is_optional, failed(conn_file, "rxPort"));
+    mapping(expected_failure::is_silent, failed(conn_file, "rxPort"));
     host.fail_call(5, failure::io);
-    mapping(presence::is_optional, broken);
+    mapping(expected_failure::is_silent, broken);
 }
 
 TEST_F(profiler_operations, logs_are_read_until_less_than_a_record_comes_ten_times_at_most) {

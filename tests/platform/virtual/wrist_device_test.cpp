@@ -50,7 +50,7 @@ TEST_F(wrist_device, has_every_service_under_an_id_of_its_own_and_the_hid_device
         EXPECT_TRUE(nrx::resolve_service_id(name, id)) << name;
         EXPECT_TRUE(ids.insert(id).second) << name;
     }
-    EXPECT_TRUE(nrx::service_conn("NRXApp").open(false));
+    EXPECT_TRUE(nrx::service_conn("NRXApp").open());
 }
 
 TEST_F(wrist_device, has_every_report_in_its_length) {
