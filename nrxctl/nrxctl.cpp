@@ -38,7 +38,7 @@ struct option_row {
 
 constexpr std::array option_rows{
     option_row{"profile", true, "SUBCOMMAND [WORD...]",
-               "control the profiler; the subcommand help lists the others", profile},
+               "control the profiler; the subcommand help shows its usage", profile},
     option_row{"scm", true, "DURATION CONFIG...",
                "print the coprocessor's bus transfers for DURATION milliseconds, or auto", scm},
     option_row{"replay", true, "SUBCOMMAND [WORD...]",
@@ -84,7 +84,8 @@ outcome help(const option_words& /*words*/) {
                        .view());
     }
     print_line("Options are carried out in order. A SERVICE is a registry name or a service id;");
-    print_line("VALUEs are hexadecimal, or decimal after 0d.");
+    print_line("VALUEs are hexadecimal, or decimal after 0d; all other numbers are decimal, or");
+    print_line("hexadecimal after 0x.");
     return outcome::done;
 }
 

@@ -1,4 +1,4 @@
-// The one place where the library ends the process.
+// The one place where the library ends the process with a status.
 #pragma once
 
 namespace nrx {
