@@ -6,19 +6,20 @@
 #include <cstdint>
 #include <initializer_list>
 #include <type_traits>
+#include <utility>
 #include <vector>
 
 namespace nrx {
 
-// The number in the first sizeof(Number) bytes at source.
+// The number in the first sizeof(Number) bytes at source. One expression, as compilers make a
+// single load of that, and not of a loop.
 template <std::integral Number>
 constexpr Number load_le(const std::uint8_t* source) {
-    std::make_unsigned_t<Number> value = 0;
-    for (std::size_t i = 0; i < sizeof(Number); ++i) {
-        value = static_cast<std::make_unsigned_t<Number>>(
-            value | static_cast<std::make_unsigned_t<Number>>(source[i]) << (8 * i));
+    using bits = std::make_unsigned_t<Number>;
+    return [source]<std::size_t... I>(std::index_sequence<I...>) {
+        return static_cast<Number>((static_cast<bits>(bits{source[I]} << (8 * I)) | ...));
     }
-    return static_cast<Number>(value);
+    (std::make_index_sequence<sizeof(Number)>());
 }
 
 // Writes a number into the first sizeof(Number) bytes at target.
