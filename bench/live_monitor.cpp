@@ -12,6 +12,7 @@
 #include "nrxctl/base/tick_period.h"
 #include "nrxctl/profiler/profile_command.h"
 #include "platform/clock.h"
+#include "platform/virtual/current_machine.h"
 #include "platform/virtual/interface_driver.h"
 #include "platform/virtual/profiler/profiler.h"
 #include "platform/virtual/wrist/parts.h"

@@ -12,7 +12,7 @@
 #include "nrxctl/decoders/record_text.h"
 #include "nrxctl/profiler/monitor.h"
 #include "platform/clock.h"
-#include "platform/virtual/machine.h"
+#include "platform/virtual/current_machine.h"
 #include "platform/virtual/wrist/parts.h"
 
 namespace {

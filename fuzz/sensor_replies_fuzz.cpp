@@ -11,8 +11,8 @@
 #include "fuzz/support/harness.h"
 #include "nrxctl/inspection/client_table.h"
 #include "nrxctl/inspection/sensor_info.h"
+#include "platform/virtual/current_machine.h"
 #include "platform/virtual/interface_driver.h"
-#include "platform/virtual/machine.h"
 
 namespace {
 

@@ -4,7 +4,8 @@
 #include <string>
 
 #include "platform/clock.h"
-#include "platform/virtual/machine.h"
+#include "platform/virtual/current_machine.h"
+#include "platform/virtual/interrupts.h"
 
 namespace platform {
 

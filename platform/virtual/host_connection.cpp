@@ -3,7 +3,7 @@
 #include <string>
 
 #include "platform/connection.h"
-#include "platform/virtual/machine.h"
+#include "platform/virtual/current_machine.h"
 
 namespace platform {
 

@@ -6,7 +6,7 @@
 #include <utility>
 
 #include "platform/hid_event_client.h"
-#include "platform/virtual/machine.h"
+#include "platform/virtual/current_machine.h"
 
 namespace platform {
 

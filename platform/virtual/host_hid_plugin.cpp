@@ -5,7 +5,7 @@
 #include <utility>
 
 #include "platform/hid_plugin.h"
-#include "platform/virtual/machine.h"
+#include "platform/virtual/current_machine.h"
 
 namespace platform {
 

@@ -4,7 +4,7 @@
 #include <utility>
 
 #include "platform/registry.h"
-#include "platform/virtual/machine.h"
+#include "platform/virtual/current_machine.h"
 #include "platform/virtual/matching.h"
 
 namespace platform {

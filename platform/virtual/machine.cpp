@@ -3,8 +3,6 @@
 #include <algorithm>
 #include <utility>
 
-#include "platform/virtual/wrist_device.h"
-
 namespace platform::simulated {
 
 entry_ref machine::add(entry described, const entry_ref& parent) {
@@ -68,26 +66,6 @@ std::optional<failure> machine::count_call() {
         std::find_if(failures_.begin(), failures_.end(),
                      [&](const planned_failure& failing) { return failing.call == call; });
     return planned == failures_.end() ? std::nullopt : std::optional(planned->how);
-}
-
-namespace {
-
-machine* installed = nullptr;
-
-}  // namespace
-
-machine& current_machine() {
-    if (installed != nullptr) return *installed;
-    static const std::unique_ptr<machine> embedded = make_wrist_device();
-    return *embedded;
-}
-
-installed_machine::installed_machine(machine& device)
-    : previous_(std::exchange(installed, &device)) {
-}
-
-installed_machine::~installed_machine() {
-    installed = previous_;
 }
 
 }  // namespace platform::simulated

@@ -11,35 +11,15 @@
 
 #include "platform/clock.h"
 #include "platform/handle.h"
+#include "platform/virtual/begun_call.h"
 #include "platform/virtual/entry.h"
 #include "platform/virtual/event_loop.h"
 #include "platform/virtual/failure.h"
 #include "platform/virtual/handle_table.h"
 #include "platform/virtual/hid_event_source.h"
-#include "platform/virtual/interrupts.h"
 #include "platform/virtual/machine_clock.h"
 
 namespace platform::simulated {
-
-// A platform call under way, and how it is to fail, if it is. Its end is a safe point: an interrupt
-// noted by then is served.
-class begun_call {
-public:
-    explicit begun_call(std::optional<failure> how) : how_(how) {}
-    ~begun_call() { serve_interrupt(); }
-    begun_call(const begun_call&) = delete;
-    begun_call& operator=(const begun_call&) = delete;
-    begun_call(begun_call&&) = delete;
-    begun_call& operator=(begun_call&&) = delete;
-
-    // Not of a temporary: its end would come before that of the call.
-    explicit operator bool() const& { return how_.has_value(); }
-    explicit operator bool() const&& = delete;
-    failure operator*() const { return *how_; }
-
-private:
-    std::optional<failure> how_;
-};
 
 class machine {
 public:
@@ -150,22 +130,6 @@ private:
     std::size_t calls_made_ = 0;
     std::vector<planned_failure> failures_;
     std::vector<planned_action> actions_;
-};
-
-// The machine that the platform functions work on: the one installed, else the embedded wrist
-// device, which is made at its first use.
-machine& current_machine();
-
-// Installs a machine for as long as this object lives.
-class installed_machine {
-public:
-    explicit installed_machine(machine& device);
-    ~installed_machine();
-    installed_machine(const installed_machine&) = delete;
-    installed_machine& operator=(const installed_machine&) = delete;
-
-private:
-    machine* previous_;
 };
 
 }  // namespace platform::simulated

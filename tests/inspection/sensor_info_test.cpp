@@ -3,6 +3,7 @@
 #include <array>
 #include <utility>
 
+#include "platform/virtual/current_machine.h"
 #include "platform/virtual/wrist_device.h"
 #include "tests/inspection/sensor_host.h"
 

@@ -10,8 +10,8 @@
 #include <gtest/gtest.h>
 
 #include "platform/registry.h"
+#include "platform/virtual/current_machine.h"
 #include "platform/virtual/interface_driver.h"
-#include "platform/virtual/machine.h"
 #include "tests/support/capture.h"
 
 namespace tests {

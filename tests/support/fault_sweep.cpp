@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include "platform/virtual/current_machine.h"
+
 namespace tests {
 
 using platform::simulated::failure;

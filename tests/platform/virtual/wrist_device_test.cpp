@@ -12,6 +12,7 @@
 #include "nrxctl/base/service_discovery.h"
 #include "platform/hid_device.h"
 #include "platform/registry.h"
+#include "platform/virtual/current_machine.h"
 
 namespace {
 
