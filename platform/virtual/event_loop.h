@@ -30,8 +30,8 @@ public:
 
 class event_loop {
 public:
-    // Puts the source of a handle on the loop, where it is not twice however often that is done;
-    // takes it off again.
+    // Puts the source of a handle on the loop, where it calls back as often as something is due,
+    // however often it was put there; takes it off again.
     void schedule(handle_id owner, const std::shared_ptr<loop_source>& source);
     void unschedule(handle_id owner);
 

@@ -7,7 +7,7 @@
 namespace platform::simulated {
 
 // Runs the registered handler if an interrupt was noted, but not inside of itself. Every platform
-// call ends with this.
+// call that can fail ends with this; waits, sleeps and the event loop do it inside as well.
 void serve_interrupt();
 
 // Blocks for that long, or without end, or until an interrupt is noted; not at all if one that was
