@@ -16,14 +16,14 @@ using simulated::machine;
 
 namespace {
 
-std::string hexadecimal(std::uint64_t value) {
+// At least so many digits.
+std::string hexadecimal(std::uint64_t value, std::size_t least) {
     constexpr std::string_view digits = "0123456789abcdef";
     std::string text;
-    do {
+    for (; value != 0 || text.size() < least; value /= 16) {
         text.insert(text.begin(), digits[value % 16]);
-        value /= 16;
-    } while (value != 0);
-    return "0x" + text;
+    }
+    return text;
 }
 
 // The call in the words of the log: "call NAME SELECTOR scalars [..] in [..] results N room N".
@@ -32,14 +32,12 @@ std::string describe_call(const entry_ref& provider, std::uint32_t selector,
     std::string text = "call " + name_of(provider) + " " + std::to_string(selector) + " scalars [";
     for (const std::uint64_t scalar : inputs.scalars) {
         if (text.back() != '[') text += ' ';
-        text += hexadecimal(scalar);
+        text += "0x" + hexadecimal(scalar, 1);
     }
     text += "] in [";
-    constexpr std::string_view digits = "0123456789abcdef";
     for (const std::uint8_t byte : inputs.structure) {
         if (text.back() != '[') text += ' ';
-        text += digits[byte / 16];
-        text += digits[byte % 16];
+        text += hexadecimal(byte, 2);
     }
     return text + "] results " + std::to_string(outputs.scalars.size()) + " room " +
            std::to_string(outputs.structure.size());
