@@ -63,7 +63,6 @@ constexpr std::array buses{
 };
 
 constexpr std::size_t bus_row_size = 32;
-constexpr std::size_t bus_name_offset = 24;
 
 consteval report_bytes<buses.size() * bus_row_size> pack_buses() {
     report_bytes<buses.size() * bus_row_size> bytes{};
@@ -74,9 +73,7 @@ consteval report_bytes<buses.size() * bus_row_size> pack_buses() {
         for (std::size_t i = 0; i < counts.size(); ++i) {
             put_number(bytes, offset + 4 * i, 4, counts[i]);
         }
-        for (std::size_t i = 0; i < row.name.size(); ++i) {
-            put_number(bytes, offset + bus_name_offset + i, 1, row.name[i]);
-        }
+        put_text(bytes, offset + 24, 8, row.name);
         offset += bus_row_size;
     }
     return bytes;

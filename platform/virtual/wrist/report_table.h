@@ -43,6 +43,17 @@ constexpr void put_number(report_bytes<Length>& bytes, std::size_t offset, std::
     }
 }
 
+// Writes a text, and the NUL that ends it, into a field of width bytes that are still 0.
+template <std::size_t Length>
+constexpr void put_text(report_bytes<Length>& bytes, std::size_t offset, std::size_t width,
+                        std::string_view text) {
+    if (offset + width > Length) field_reaches_beyond_its_report();
+    if (text.size() >= width) field_is_too_narrow_for_its_value();
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        put_number(bytes, offset + i, 1, text[i]);
+    }
+}
+
 // A report of the given length; what no field covers is 0.
 template <std::size_t Length>
 consteval report_bytes<Length> make_report(std::initializer_list<report_field> fields) {

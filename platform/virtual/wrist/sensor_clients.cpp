@@ -49,9 +49,7 @@ consteval report_bytes<entry_size> pack(const client_row& row) {
         {29, 1, row.option ? 1 : 0, "option"},
         {30, 1, row.power, "power"},
     });
-    if (row.name.size() > 11) field_reaches_beyond_its_report();
-    for (std::size_t i = 0; i < row.name.size(); ++i)
-        put_number(entry, i, 1, row.name[i]);
+    put_text(entry, 0, 12, row.name);
     return entry;
 }
 

@@ -50,9 +50,7 @@ consteval report_bytes<4 + 24 * Count> counters(const counter_row (&rows)[Count]
     for (std::size_t i = 0; i < Count; ++i) {
         const counter_row& row = rows[i];
         const std::size_t entry = 4 + 24 * i;
-        if (row.name.size() > 7) field_reaches_beyond_its_report();
-        for (std::size_t c = 0; c < row.name.size(); ++c)
-            put_number(bytes, entry + c, 1, row.name[c]);
+        put_text(bytes, entry, 8, row.name);
         put_number(bytes, entry + 8, 4, row.value);
         put_number(bytes, entry + 12, 4, row.lowest);
         put_number(bytes, entry + 16, 4, row.highest);

@@ -152,8 +152,7 @@ constexpr word_report word(std::int64_t value) {
 
 constexpr text_report text(std::string_view text) {
     text_report bytes{};
-    for (std::size_t i = 0; i < text.size() + 1; ++i)
-        put_number(bytes, i, 1, i < text.size() ? text[i] : 0);
+    put_text(bytes, 0, bytes.size(), text);
     return bytes;
 }
 
