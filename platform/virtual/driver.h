@@ -1,6 +1,9 @@
 // What stands behind a registry entry: the kernel's side of a connection.
 #pragma once
 
+#include <algorithm>
+#include <array>
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 
@@ -46,6 +49,26 @@ struct method_shape {
 // success if the arguments have the method's shape, else bad_argument.
 return_code check_shape(const method_shape& shape, const call_inputs& inputs,
                         const call_outputs& outputs);
+
+// A row in the table of a driver's methods.
+template <class Driver>
+struct method {
+    std::uint32_t selector;
+    method_shape shape;
+    return_code (Driver::*run)(const call_inputs& inputs, call_outputs& outputs);
+};
+
+// Runs the method with that selector if the arguments have its shape; unsupported if there is none.
+template <class Driver, std::size_t Count>
+return_code run_method(Driver& of, const std::array<method<Driver>, Count>& methods,
+                       std::uint32_t selector, const call_inputs& inputs, call_outputs& outputs) {
+    const auto* row = std::find_if(
+        methods.begin(), methods.end(),
+        [&](const method<Driver>& candidate) { return candidate.selector == selector; });
+    if (row == methods.end()) return unsupported;
+    const return_code fitting = check_shape(row->shape, inputs, outputs);
+    return fitting == success ? (of.*row->run)(inputs, outputs) : fitting;
+}
 
 // Answers with reply in the structure output and cuts it to size; no_room if it is too small.
 return_code answer(byte_view reply, call_outputs& outputs);

@@ -33,11 +33,7 @@ void interface_driver::set_named_property(std::string_view name, byte_list value
 
 return_code interface_driver::call(std::uint32_t selector, const call_inputs& inputs,
                                    call_outputs& outputs) {
-    struct method {
-        std::uint32_t selector;
-        method_shape shape;
-        return_code (interface_driver::*run)(const call_inputs&, call_outputs&);
-    };
+    using method = simulated::method<interface_driver>;
     using enum presence;
     static constexpr std::array methods{
         method{1, {1, required, 0, none}, &interface_driver::write_report},
@@ -47,12 +43,7 @@ return_code interface_driver::call(std::uint32_t selector, const call_inputs& in
         method{5, {0, required, 0, required}, &interface_driver::read_named_property},
     };
     if (selector == scalar_selector) return run_scalar_method(inputs, outputs);
-    const auto* row = std::find_if(methods.begin(), methods.end(), [&](const method& candidate) {
-        return candidate.selector == selector;
-    });
-    if (row == methods.end()) return unsupported;
-    const return_code shape = check_shape(row->shape, inputs, outputs);
-    return shape == success ? (this->*row->run)(inputs, outputs) : shape;
+    return run_method(*this, methods, selector, inputs, outputs);
 }
 
 return_code interface_driver::run_scalar_method(const call_inputs& inputs,

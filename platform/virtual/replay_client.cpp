@@ -16,17 +16,26 @@ class replay_client final : public driver {
 public:
     explicit replay_client(std::shared_ptr<replay_app> app) : app_(std::move(app)) {}
 
-    // A method's selector is its place in the table. Each takes a structure and gives nothing.
     return_code call(std::uint32_t selector, const call_inputs& inputs,
                      call_outputs& outputs) override {
-        static constexpr std::array methods{&replay_app::load, &replay_app::unload};
-        constexpr method_shape shape{0, presence::required, 0, presence::none};
-        if (selector >= methods.size()) return unsupported;
-        const return_code fitting = check_shape(shape, inputs, outputs);
-        return fitting == success ? ((*app_).*methods[selector])(inputs.structure) : fitting;
+        using method = simulated::method<replay_client>;
+        using enum presence;
+        static constexpr std::array methods{
+            method{0, {0, required, 0, none}, &replay_client::load},
+            method{1, {0, required, 0, none}, &replay_client::unload},
+        };
+        return run_method(*this, methods, selector, inputs, outputs);
     }
 
 private:
+    return_code load(const call_inputs& inputs, call_outputs& /*outputs*/) {
+        return app_->load(inputs.structure);
+    }
+
+    return_code unload(const call_inputs& inputs, call_outputs& /*outputs*/) {
+        return app_->unload(inputs.structure);
+    }
+
     std::shared_ptr<replay_app> app_;
 };
 
