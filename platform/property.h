@@ -1,7 +1,6 @@
 // Property values of the driver registry: numbers, texts, arrays and dictionaries.
 #pragma once
 
-#include <cstddef>
 #include <cstdint>
 #include <initializer_list>
 #include <optional>

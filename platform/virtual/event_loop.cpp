@@ -1,6 +1,5 @@
 #include "platform/virtual/event_loop.h"
 
-#include <algorithm>
 #include <utility>
 
 #include "platform/virtual/interrupts.h"

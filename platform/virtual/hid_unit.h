@@ -5,9 +5,6 @@
 #include <map>
 #include <vector>
 
-#include "platform/bytes.h"
-#include "platform/return_code.h"
-
 namespace platform::simulated {
 
 class hid_unit {

@@ -1,5 +1,6 @@
 // What a backend promises about shared data queues.
 
+#include "platform/virtual/return_codes.h"
 #include "tests/platform/queue_host.h"
 
 namespace tests {

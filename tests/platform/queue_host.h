@@ -5,7 +5,6 @@
 #include <memory>
 
 #include "platform/data_queue.h"
-#include "platform/virtual/return_codes.h"
 #include "tests/support/device_test.h"
 
 namespace tests {

@@ -1,6 +1,5 @@
 // What the firmware of the sensors tells in its own words: blocks of tagged items.
 
-#include <array>
 #include <cstddef>
 #include <initializer_list>
 

@@ -1,7 +1,6 @@
 // What the HID event system has to tell: each kind of news in a rhythm of its own, handed over a
 // little after it happened.
 
-#include <algorithm>
 #include <array>
 #include <chrono>
 #include <cmath>

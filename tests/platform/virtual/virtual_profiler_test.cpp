@@ -2,6 +2,7 @@
 
 #include "platform/virtual/little_endian.h"
 #include "platform/virtual/profiler/profiler.h"
+#include "platform/virtual/return_codes.h"
 #include "tests/platform/queue_host.h"
 
 namespace tests {
