@@ -1,6 +1,7 @@
 // The words of a command line behind an option, taken one after the other.
 #pragma once
 
+#include <cstddef>
 #include <optional>
 #include <span>
 #include <string_view>
@@ -15,6 +16,9 @@ public:
 
     // The next word; none at the end.
     std::optional<std::string_view> take();
+
+    // How many words there are to take.
+    [[nodiscard]] std::size_t left() const;
 
     // Makes a word that came from elsewhere, as the option's own argument, the next one.
     void put_first(std::string_view word) { first_ = word; }

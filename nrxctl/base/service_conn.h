@@ -24,7 +24,7 @@ public:
 
     // Finds the service by its bare registry name, of whatever class, takes its first child and
     // opens a connection of type 0 on that. Whether the connection is open; if not, the check that
-    // failed is reported, a missing service unless so asked.
+    // failed is reported, but for a missing service if that is to be silent.
     bool open(expected_failure missing = expected_failure::is_reported);
 
     // The connection; none before a successful open.

@@ -32,13 +32,13 @@ public:
     profiler_conn() : service_conn(std::string(profiler_driver_name)) {}
 
     // Finds the driver by its registry name and opens a connection of type 0 on it. Whether the
-    // connection is open; if not, the check that failed is reported, a missing driver unless so
-    // asked.
+    // connection is open; if not, the check that failed is reported, but for a missing driver if
+    // that is to be silent.
     bool open(expected_failure missing = expected_failure::is_reported);
 
     // Opens, maps the driver's event queue and attaches a port that is signalled when events
-    // arrive. Whether all of it stands; if not, the check that failed is reported, a mapping that
-    // fails, or succeeds and hands over no memory, unless so asked.
+    // arrive. Whether all of it stands; if not, the check that failed is reported, but for a
+    // mapping that fails, or succeeds and hands over no memory, if that is to be silent.
     bool open_queue(expected_failure mapping = expected_failure::is_reported);
 
     // None before a successful open_queue.

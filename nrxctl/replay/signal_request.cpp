@@ -38,18 +38,18 @@ void print_refusal(std::string_view what, std::string_view word) {
 }  // namespace
 
 std::optional<signal_request> read_signal_request(argument_words& words) {
-    const auto service = words.take();
-    const auto signal_type = words.take();
-    const auto interval_word = words.take();
-    const auto count_word = words.take();
-    if (!check(count_word, "argc >= optind+4")) return std::nullopt;
-    signal_request request{*service, *signal_type,
-                           parse_low_32_bits(*interval_word, "invalid interval"), 0};
-    if (!is_frequency(*count_word)) {
-        request.samples = parse_low_32_bits(*count_word, "invalid number of samples");
+    if (!check(words.left() >= 4, "argc >= optind+4")) return std::nullopt;
+    const std::string_view service = *words.take();
+    const std::string_view signal_type = *words.take();
+    const std::string_view interval_word = *words.take();
+    const std::string_view count_word = *words.take();
+    signal_request request{service, signal_type,
+                           parse_low_32_bits(interval_word, "invalid interval"), 0};
+    if (!is_frequency(count_word)) {
+        request.samples = parse_low_32_bits(count_word, "invalid number of samples");
         return request;
     }
-    const auto samples = samples_per_period(*count_word, request.interval);
+    const auto samples = samples_per_period(count_word, request.interval);
     if (!samples) return std::nullopt;
     request.samples = *samples;
     return request;

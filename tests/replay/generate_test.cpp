@@ -126,6 +126,9 @@ TEST_F(generate, a_frequency_makes_one_period_in_which_there_must_be_a_sample) {
 TEST_F(generate, words_that_are_missing_or_no_numbers_are_refused_in_order) {
     for (const char* words : {"generate", "generate a", "generate a b", "generate a b c"})
         says(split(words), "", failed("replay/signal_request.cpp", "argc >= optind+4"));
+    int taken = 77;
+    replay({"generate", "a", "b", "c"}, &taken);
+    EXPECT_EQ(taken, 0);
     for (const auto& [words, message] : rows<std::string, std::string>{
              {"a b c d", "invalid interval (c)"},
              {"a b 1 d", "invalid number of samples (d)"},
