@@ -4,8 +4,8 @@
 #include <sstream>
 
 #include "nrxctl/base/tick_period.h"
-#include "nrxctl/inspection/event_stream.h"
 #include "nrxctl/inspection/clock_references.h"
+#include "nrxctl/inspection/event_stream.h"
 #include "nrxctl/inspection/hid_event_times.h"
 #include "nrxctl/inspection/hid_events.h"
 
