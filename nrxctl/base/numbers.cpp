@@ -139,6 +139,12 @@ std::optional<std::int64_t> read_digits(std::string_view digits, int base) {
 }
 
 std::int64_t parse_number(std::string_view word, std::string_view message) {
+    // Most values in sample files are "0x" and eight digits: such a word is read without a look at
+    // what else it might be.
+    if (word.size() == hex_prefix.size() + word_length && word.starts_with(hex_prefix)) {
+        const std::int64_t value = read_word<16>({word.data() + hex_prefix.size(), word_length});
+        if (value != no_number) return value;
+    }
     const auto [negative, hexadecimal, digits] = split_number(word);
     if (!digits.empty() && digits.size() <= word_length) {
         const std::int64_t value = hexadecimal ? read_word<16>(digits) : read_word<10>(digits);

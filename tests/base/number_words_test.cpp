@@ -21,7 +21,8 @@ TEST(parse_number, reads_decimal_and_prefixed_hexadecimal) {
     using row = std::pair<std::string, std::int64_t>;
     for (const auto& [word, value] :
          {row{"0", 0}, row{"7", 7}, row{"+7", 7}, row{"-7", -7}, row{"007", 7}, row{"0x1f", 31},
-          row{"-0x10", -16}, row{"+0xAb", 171}, row{"0x0", 0}, row{"0x7fffffffffffffff", largest},
+          row{"-0x10", -16}, row{"+0xAb", 171}, row{"0x0", 0}, row{"0x89abCDEF", 0x89abcdef},
+          row{"-0x89abcdef", -0x89abcdefLL}, row{"0x7fffffffffffffff", largest},
           row{"0x0123456789abcdEF", 0x0123456789abcdef}, row{"999999999999999", 999999999999999},
           row{"1000000000000000", 1000000000000000}, row{"0xfffffffffffffff", 0xfffffffffffffff},
           row{"9223372036854775807", largest}, row{"-9223372036854775807", -largest}})
@@ -31,7 +32,7 @@ TEST(parse_number, reads_decimal_and_prefixed_hexadecimal) {
 TEST(parse_number, ends_the_process_with_the_message_and_the_word) {
     for (const std::string& word :
          split(",12a,a,-,+,--5,+-5,- 5, 5,5 ,1.5,0x,-0x,0X1f,0x1g,0x-1,0x "
-               "1,x1,5:,5/,0x5G,0x5@,0x5`,12345678901234g,"
+               "1,x1,5:,5/,0x5G,0x5@,0x5`,0x89abcdeg,0x-1234567,12345678901234g,"
                "12345678901234567a,\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff\xff,"
                "9223372036854775808,"
                "-9223372036854775808,0x8000000000000000,0x10000000000000000",
