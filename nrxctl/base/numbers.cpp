@@ -43,7 +43,7 @@ struct digit_bytes {
     bool all_fit;  // every character is a digit
 };
 
-template <unsigned Base>
+template <std::uint64_t Base>
 digit_bytes digits_of(std::uint64_t characters);
 
 template <>

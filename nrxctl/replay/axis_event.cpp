@@ -76,7 +76,7 @@ bool AxisEvent::init_generator(std::string_view signal_type) {
     if (find_word_row(signals, signal_type) == nullptr) return false;
     std::srand(static_cast<unsigned>(std::time(nullptr)));
     next_sample_ = 0;
-    timestamp_ = 0;
+    next_timestamp_ = 0;
     return true;
 }
 
@@ -88,10 +88,10 @@ std::string AxisEvent::generate(std::string_view signal_type, std::uint32_t inte
     line.text(name()).text(",x=0x").zero_padded_hex(static_cast<std::uint32_t>(value), 8);
     line.text(",y=0x00000000,z=0x00000000,sampleid=");
     line.number(static_cast<std::int32_t>(next_sample_));
-    line.text(",timestamp=").number(static_cast<std::int64_t>(timestamp_));
+    line.text(",timestamp=").number(static_cast<std::int64_t>(next_timestamp_));
     line.text(",temperature=").text(generated_temperature);
     ++next_sample_;
-    timestamp_ += interval;
+    next_timestamp_ += interval;
     return std::string(line.view());
 }
 

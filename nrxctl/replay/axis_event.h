@@ -26,8 +26,9 @@ private:
     using record = sample_record<3>;
 
     record record_;
-    std::uint32_t next_sample_ = 0;  // of the generated signal
-    std::uint64_t timestamp_ = 0;    // of the next sample while a signal is generated
+    std::uint32_t next_sample_ = 0;     // of the generated signal
+    std::uint64_t next_timestamp_ = 0;  // likewise, microseconds
+    std::uint64_t timestamp_ = 0;
 };
 
 class AccelEvent final : public AxisEvent {

@@ -159,6 +159,7 @@ TEST_F(generate, a_generator_begins_anew_when_it_is_prepared) {
     EXPECT_TRUE(event->init_generator("delta"));
     EXPECT_EQ(event->generate("delta", 7, 2), first);
     EXPECT_EQ(event->generate("other", 7, 2) + "\n", sample("accel", "00000000", 1, 7));
+    EXPECT_EQ(event->timestamp(), 0U);
 }
 
 TEST_F(generate, every_signal_loads_back_as_it_was_written) {
