@@ -165,4 +165,51 @@ TEST_F(virtual_profiler, stream_ends_when_asked_or_after_its_duration_and_begins
     EXPECT_EQ(events.back().type, 0U);
 }
 
+TEST_F(virtual_profiler, logs_and_dump_hold_what_was_done_and_are_emptied_by_reading) {
+    const auto kernel_log = [&] { return call(kernel, 9, {}, {}, 95); };
+    const auto coprocessor_log = [&] { return call(coprocessor, 2, {0xd1}, {}, 65536); };
+    const auto error_dump = [&] { return call(kernel, 8, {}, {}, 48000); };
+    kernel_log();
+    coprocessor_log();
+    configure_coprocessor({enabled(0, 0)});
+    enable(true);
+    set_duration(0x10, 0x27);
+    const byte_list notes = coprocessor_log();
+    ASSERT_EQ(notes.size(), 96U);
+    EXPECT_EQ(get_u32(notes, 48 + 16), 10000U);
+    EXPECT_TRUE(coprocessor_log().empty());
+    enable(false);
+    for (const std::size_t size : {48U, 48U, 0U})
+        EXPECT_EQ(kernel_log().size(), size);
+    EXPECT_TRUE(error_dump().empty());
+    set_duration(0, 0);
+    enable(true);
+    receive();
+    receive();
+    call(kernel, 10, {});
+    const byte_list dump = error_dump();
+    ASSERT_EQ(dump.size(), 33U * 48U);
+    EXPECT_EQ(event({dump.end() - 96, dump.end() - 48}).time, 40000U);
+    EXPECT_EQ(event({dump.end() - 48, dump.end()}).category, 8U);
+}
+
+TEST_F(virtual_profiler, statistics_move_and_can_be_cleared_and_other_words_are_refused) {
+    const auto count = [&] {
+        return get_u32(call(coprocessor, 3, {0x20}, {0, 0, 0, 0, 1, 0, 0, 0}, 12800), 48);
+    };
+    const auto wakes = [&] {
+        return get_u32(call(coprocessor, 3, {0x20}, {10, 0, 0, 0, 0, 0, 0, 0}, 108), 4);
+    };
+    EXPECT_EQ(count() + wakes(), 0U);
+    host.clock().pass(60s);
+    EXPECT_EQ(count(), 1200U);
+    EXPECT_EQ(wakes(), 15U);
+    call(coprocessor, 3, {0x20}, byte_list(8));
+    EXPECT_EQ(count(), 0U);
+    EXPECT_EQ(wakes(), 15U);
+    call(coprocessor, 3, {0x20}, byte_list(4), 0, platform::bad_argument);
+    call(coprocessor, 1, {0xd5}, {2, 0, 0, 0}, 0, platform::bad_argument);
+    call(kernel, 0, {2}, {}, 0, platform::bad_argument);
+}
+
 }  // namespace tests
