@@ -1,7 +1,7 @@
-// compare PAIRS LABEL RATIO MEGABYTES OURS... -- PEER...: runs two command lines in turns, PAIRS
-// times each, and prints a row of a table: the label, the median time of each, the ratio of the two
-// with the middle half of all pairs' ratios, the budget of the ratio, the peak memory of the first,
-// and its budget. A budget of "-" is none. Without words it prints the head of the table.
+// compare PAIRS LABEL RATIO MEGABYTES OURS... -- PEER...: runs two command lines alternately, PAIRS
+// times each, and prints a table row: the label, the two median times, their ratio, the
+// interquartile range of the ratios of all pairs, the ratio's budget, the peak memory of OURS and
+// its budget. The budget "-" means no limit. Without arguments it prints the table header.
 #include <algorithm>
 #include <cstdio>
 #include <cstdlib>
@@ -15,6 +15,7 @@
 
 namespace {
 
+// The command line.
 struct comparison {
     int pairs;
     std::string label;
@@ -24,83 +25,86 @@ struct comparison {
     std::vector<std::string> peer;
 };
 
-// What the processes cost that ran in turns.
-struct samples {
+struct measurements {
     std::vector<double> ours;
     std::vector<double> peer;
     std::vector<double> ratios;  // of each pair
-    double megabytes = 0;        // the most that ours took
+    double megabytes = 0;        // peak memory of ours
 };
 
-std::optional<comparison> read_arguments(std::span<char*> words) {
-    constexpr std::size_t before_lines = 4;
-    if (words.size() < before_lines) return std::nullopt;
-    const auto lines = words.subspan(before_lines);
-    const auto divider = std::find(lines.begin(), lines.end(), std::string_view("--"));
-    if (divider == lines.begin() || lines.end() - divider < 2) return std::nullopt;
-    return comparison{
-        std::max(1, std::atoi(words[0])), words[1], words[2], words[3], {lines.begin(), divider},
-        {divider + 1, lines.end()}};
+std::optional<comparison> parse_arguments(std::span<char*> arguments) {
+    constexpr std::size_t fixed_arguments = 4;
+    if (arguments.size() < fixed_arguments) return std::nullopt;
+    const auto commands = arguments.subspan(fixed_arguments);
+    const auto separator = std::find(commands.begin(), commands.end(), std::string_view("--"));
+    if (separator == commands.begin() || commands.end() - separator < 2) return std::nullopt;
+    return comparison{.pairs = std::max(1, std::atoi(arguments[0])),
+                      .label = arguments[1],
+                      .ratio_budget = arguments[2],
+                      .megabytes_budget = arguments[3],
+                      .ours = {commands.begin(), separator},
+                      .peer = {separator + 1, commands.end()}};
 }
 
-// The value below which a share of all values lies.
-double quantile(std::vector<double> values, double share) {
+// Returns the value below which a fraction of the values lies.
+double quantile(std::vector<double> values, double fraction) {
     std::sort(values.begin(), values.end());
-    return values[static_cast<std::size_t>(share * static_cast<double>(values.size() - 1))];
+    return values[static_cast<std::size_t>(fraction * static_cast<double>(values.size() - 1))];
 }
 
 double median(const std::vector<double>& values) {
     return quantile(values, 0.5);
 }
 
-samples run(const comparison& asked) {
-    samples taken;
-    // What both read is in memory from here on.
-    bench::run_once(asked.ours);
-    bench::run_once(asked.peer);
-    for (int i = 0; i < asked.pairs; ++i) {
-        const auto ours = bench::run_once(asked.ours);
-        const auto peer = bench::run_once(asked.peer);
-        taken.ours.push_back(ours.microseconds);
-        taken.peer.push_back(peer.microseconds);
-        taken.ratios.push_back(ours.microseconds / peer.microseconds);
-        taken.megabytes = std::max(taken.megabytes, ours.megabytes);
+measurements run(const comparison& comparison) {
+    measurements results;
+    // Warms the page cache with everything that the two read.
+    bench::run_once(comparison.ours);
+    bench::run_once(comparison.peer);
+    for (int i = 0; i < comparison.pairs; ++i) {
+        const auto ours = bench::run_once(comparison.ours);
+        const auto peer = bench::run_once(comparison.peer);
+        results.ours.push_back(ours.microseconds);
+        results.peer.push_back(peer.microseconds);
+        results.ratios.push_back(ours.microseconds / peer.microseconds);
+        results.megabytes = std::max(results.megabytes, ours.megabytes);
     }
-    return taken;
+    return results;
 }
 
-// A budget, and whether what was measured is over it.
-std::string judged(double measured, const std::string& budget) {
+// Returns the budget, marked if the measured value exceeds it.
+std::string format_budget(double measured, const std::string& budget) {
     const bool over = budget != "-" && measured > std::atof(budget.c_str());
     return over ? budget + " over" : budget;
 }
 
-void print_head() {
+void print_header() {
     std::printf("%-42s %10s %10s %7s %-17s %-11s %6s %s\n", "", "ours, us", "peer, us", "ratio",
                 "middle half", "budget", "MB", "budget");
 }
 
-void print_row(const comparison& asked, const samples& taken) {
-    const double ratio = median(taken.ours) / median(taken.peer);
-    std::printf("%-42s %10.0f %10.0f %7.3f %7.3f - %-7.3f %-11s %6.2f %s\n", asked.label.c_str(),
-                median(taken.ours), median(taken.peer), ratio, quantile(taken.ratios, 0.25),
-                quantile(taken.ratios, 0.75), judged(ratio, asked.ratio_budget).c_str(),
-                taken.megabytes, judged(taken.megabytes, asked.megabytes_budget).c_str());
+void print_row(const comparison& comparison, const measurements& results) {
+    const double ratio = median(results.ours) / median(results.peer);
+    std::printf("%-42s %10.0f %10.0f %7.3f %7.3f - %-7.3f %-11s %6.2f %s\n",
+                comparison.label.c_str(), median(results.ours), median(results.peer), ratio,
+                quantile(results.ratios, 0.25), quantile(results.ratios, 0.75),
+                format_budget(ratio, comparison.ratio_budget).c_str(), results.megabytes,
+                format_budget(results.megabytes, comparison.megabytes_budget).c_str());
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
-    const std::span<char*> words{argv + 1, static_cast<std::size_t>(argc - 1)};
-    if (words.empty()) {
-        print_head();
+    const std::span<char*> arguments{argv + 1, static_cast<std::size_t>(argc - 1)};
+    if (arguments.empty()) {
+        print_header();
         return EXIT_SUCCESS;
     }
-    const auto asked = read_arguments(words);
-    if (!asked) {
+    const auto comparison = parse_arguments(arguments);
+    if (!comparison) {
         std::fputs("usage: compare PAIRS LABEL RATIO MEGABYTES OURS... -- PEER...\n", stderr);
         return EXIT_FAILURE;
     }
-    print_row(*asked, run(*asked));
+    print_row(*comparison, run(*comparison));
     return EXIT_SUCCESS;
 }

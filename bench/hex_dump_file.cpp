@@ -1,4 +1,4 @@
-// hex_dump_file FILE: the hexadecimal dump of a file.
+// hex_dump_file FILE: prints a file as a hexadecimal dump.
 #include <cstdlib>
 #include <vector>
 

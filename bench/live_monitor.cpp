@@ -1,7 +1,5 @@
-// Monitors the virtual profiler at 10,000 records a second, as text and in real time, and prints
-// the share of a core that this takes as a row of the table of scripts/bench:
-//   live_monitor SECONDS
-
+// live_monitor SECONDS: monitors the virtual profiler at 10,000 records a second, as text and in
+// real time, and prints the share of a core that this uses, as a row of the table of scripts/bench.
 #include <cstdio>
 #include <cstdlib>
 #include <fcntl.h>
@@ -9,7 +7,7 @@
 #include <sys/resource.h>
 #include <unistd.h>
 
-#include "nrxctl/base/tick_period.h"
+#include "nrxctl/base/clock_references.h"
 #include "nrxctl/profiler/profile_command.h"
 #include "platform/clock.h"
 #include "platform/virtual/current_machine.h"
@@ -27,19 +25,19 @@ double seconds(const timeval& time) {
 }
 
 double processor_seconds() {
-    rusage used{};
-    ::getrusage(RUSAGE_SELF, &used);
-    return seconds(used.ru_utime) + seconds(used.ru_stime);
+    rusage usage{};
+    ::getrusage(RUSAGE_SELF, &usage);
+    return seconds(usage.ru_utime) + seconds(usage.ru_stime);
 }
 
-// Everything that the process writes meanwhile goes nowhere.
+// Runs the monitor with standard output redirected to /dev/null.
 void monitor(std::string milliseconds) {
     std::string config = "sensor:accel,gyro:data,lat";
-    char* const words[]{milliseconds.data(), config.data()};
+    char* const arguments[]{milliseconds.data(), config.data()};
     const int output = ::dup(STDOUT_FILENO);
     ::dup2(::open("/dev/null", O_WRONLY | O_CLOEXEC), STDOUT_FILENO);
     int index = 0;
-    nrx::profile_command("human", words, index);
+    nrx::profile_command("human", arguments, index);
     ::dup2(output, STDOUT_FILENO);
 }
 

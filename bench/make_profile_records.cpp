@@ -1,7 +1,5 @@
-// Writes event records on standard output, for the benchmarks:
-//   make_profile_records COUNT [random]
-// Records as a busy device makes them, or random bytes. The same count gives the same bytes.
-
+// make_profile_records COUNT [random]: writes event records to standard output, like those of a
+// busy device or random bytes. The same arguments always produce the same bytes.
 #include <array>
 #include <cstdint>
 #include <cstdio>
@@ -15,12 +13,12 @@ namespace {
 
 using nrx::profile_record;
 
-// How often a kind of record comes, out of the sum of all weights.
+// A kind of record and its frequency, relative to the sum of all weights.
 struct record_kind {
     unsigned weight;
     std::uint8_t category;
-    std::uint8_t components;  // as many are in use
-    std::uint8_t events;
+    std::uint8_t components;  // number of components in use
+    std::uint8_t events;      // number of events in use
     std::uint8_t type;
 };
 constexpr std::array kinds{
@@ -44,91 +42,91 @@ constexpr std::array kinds{
 };
 constexpr std::array<std::string_view, 4> texts{"accel", "als_filter", "gyro_decimate", "imu"};
 
-void put(profile_record& record, std::size_t offset, std::uint64_t value, std::size_t width) {
+void set_field(profile_record& record, std::size_t offset, std::uint64_t value, std::size_t width) {
     for (std::size_t i = 0; i < width; ++i)
         record.bytes[offset + i] = static_cast<std::uint8_t>(value >> (8 * i));
 }
 
-class record_source {
+class record_generator {
 public:
-    profile_record random_bytes() {
+    profile_record random_record() {
         profile_record record;
         for (std::size_t offset = 0; offset < record.bytes.size(); offset += 8)
-            put(record, offset, random_(), 8);
+            set_field(record, offset, random_(), 8);
         return record;
     }
 
-    profile_record realistic() {
+    profile_record realistic_record() {
         const record_kind& kind = pick_kind();
         profile_record record{};
-        timestamp_ += below(400);
-        put(record, 0, kind.type, 1);
-        put(record, 1, below(kind.events), 1);
-        put(record, 2, below(kind.components), 1);
-        put(record, 3, kind.category, 1);
-        put(record, 4, ++sequence_, 4);
-        put(record, 8, timestamp_, 8);
-        put_body(record, kind.type);
+        timestamp_ += random_below(400);
+        set_field(record, 0, kind.type, 1);
+        set_field(record, 1, random_below(kind.events), 1);
+        set_field(record, 2, random_below(kind.components), 1);
+        set_field(record, 3, kind.category, 1);
+        set_field(record, 4, ++sequence_, 4);
+        set_field(record, 8, timestamp_, 8);
+        set_body(record, kind.type);
         return record;
     }
 
 private:
-    std::uint64_t below(std::uint64_t limit) { return random_() % limit; }
+    std::uint64_t random_below(std::uint64_t limit) { return random_() % limit; }
 
     // Small numbers are more common than large ones.
-    std::uint64_t some_number() { return (random_() & 0xffffffff) >> below(32); }
+    std::uint64_t skewed_number() { return (random_() & 0xffffffff) >> random_below(32); }
 
     const record_kind& pick_kind() {
         unsigned sum = 0;
         for (const record_kind& kind : kinds)
             sum += kind.weight;
-        std::uint64_t left = below(sum);
+        std::uint64_t remaining = random_below(sum);
         const auto* kind = kinds.data();
-        for (; left >= kind->weight; ++kind)
-            left -= kind->weight;
+        for (; remaining >= kind->weight; ++kind)
+            remaining -= kind->weight;
         return *kind;
     }
 
-    void put_text(profile_record& record, std::size_t offset, std::size_t room) {
-        const std::string_view text = texts[below(texts.size())].substr(0, room);
-        for (std::size_t i = 0; i < room; ++i)
+    void set_text(profile_record& record, std::size_t offset, std::size_t capacity) {
+        const std::string_view text = texts[random_below(texts.size())].substr(0, capacity);
+        for (std::size_t i = 0; i < capacity; ++i)
             record.bytes[offset + i] = i < text.size() ? static_cast<std::uint8_t>(text[i]) : 0;
     }
 
-    void put_bytes(profile_record& record, std::size_t offset, std::size_t count) {
+    void set_random_bytes(profile_record& record, std::size_t offset, std::size_t count) {
         for (std::size_t i = 0; i < count; ++i)
-            put(record, offset + i, random_(), 1);
+            set_field(record, offset + i, random_(), 1);
     }
 
-    void put_body(profile_record& record, std::uint8_t type) {
+    void set_body(profile_record& record, std::uint8_t type) {
         for (std::size_t offset = 16; offset < 40; offset += 4)
-            put(record, offset, some_number(), 4);
+            set_field(record, offset, skewed_number(), 4);
         switch (type) {
             case 1: {
-                const std::uint64_t length = 4 + below(21);
-                put(record, 16, below(8), 2);
-                put(record, 18, 24 + below(200), 2);
-                put(record, 20, length, 2);
-                put(record, 22, below(100), 2);
-                put_bytes(record, 24, length);
+                const std::uint64_t length = 4 + random_below(21);
+                set_field(record, 16, random_below(8), 2);
+                set_field(record, 18, 24 + random_below(200), 2);
+                set_field(record, 20, length, 2);
+                set_field(record, 22, random_below(100), 2);
+                set_random_bytes(record, 24, length);
                 break;
             }
             case 2:
-                put(record, 16, below(8), 2);
-                put_bytes(record, 18, 30);
+                set_field(record, 16, random_below(8), 2);
+                set_random_bytes(record, 18, 30);
                 break;
             case 8:
-                put(record, 32, 0x000201, 3);
-                put_text(record, 35, 12);
+                set_field(record, 32, 0x000201, 3);
+                set_text(record, 35, 12);
                 break;
             case 9:
-                put_text(record, 32, 16);
+                set_text(record, 32, 16);
                 break;
             case 11:
-                put_text(record, 24, 8);
+                set_text(record, 24, 8);
                 break;
             case 12:
-                put_text(record, 36, 12);
+                set_text(record, 36, 12);
                 break;
             default:
                 break;
@@ -146,9 +144,10 @@ int main(int argc, char** argv) {
     if (argc < 2) return EXIT_FAILURE;
     const auto count = std::strtoull(argv[1], nullptr, 10);
     const bool random = argc > 2 && std::string_view(argv[2]) == "random";
-    record_source source;
+    record_generator generator;
     for (std::uint64_t i = 0; i < count; ++i) {
-        const profile_record record = random ? source.random_bytes() : source.realistic();
+        const profile_record record =
+            random ? generator.random_record() : generator.realistic_record();
         std::fwrite(record.bytes.data(), record.bytes.size(), 1, stdout);
     }
     return std::fflush(stdout) == 0 ? EXIT_SUCCESS : EXIT_FAILURE;

@@ -1,14 +1,13 @@
-// Prints the event records in a file as text, through the profiler's monitor:
-//   monitor_profile_records FILE
-// A driver hands them over in its queue, then the end marker. Time is free: no wait lasts.
-
+// monitor_profile_records FILE: prints the event records of a file as text, through the profiler's
+// monitor. A driver delivers them in its queue, followed by the end marker. Time is simulated, so
+// waiting costs nothing.
 #include <array>
 #include <cstdio>
 #include <cstdlib>
 #include <memory>
 #include <utility>
 
-#include "nrxctl/base/tick_period.h"
+#include "nrxctl/base/clock_references.h"
 #include "nrxctl/decoders/record_text.h"
 #include "nrxctl/profiler/monitor.h"
 #include "platform/clock.h"
@@ -21,7 +20,7 @@ using platform::simulated::shared_queue;
 
 using open_file = std::unique_ptr<std::FILE, int (*)(std::FILE*)>;
 
-// Holds the records of a file, read when the tool has taken those before.
+// A queue that refills itself from a file when the tool has consumed its records.
 class file_queue final : public shared_queue {
 public:
     explicit file_queue(open_file file) : file_(std::move(file)) {}
@@ -63,8 +62,8 @@ int main(int argc, char** argv) {
     if (!file) return EXIT_FAILURE;
     platform::simulated::machine host;
     platform::simulated::add_clocks(host);
-    host.add(
-        {.name = "KeltoNRXProfileDriver", .unit = std::make_shared<queue_driver>(std::move(file))});
+    host.add({.name = "KeltoNRXProfileDriver",
+              .driver = std::make_shared<queue_driver>(std::move(file))});
     const platform::simulated::installed_machine installed(host);
     nrx::tick_period = platform::tick_period();
     return nrx::monitor_profiler(0, nrx::print_profile_record) ? EXIT_SUCCESS : EXIT_FAILURE;

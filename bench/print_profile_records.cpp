@@ -1,13 +1,11 @@
-// Prints the event records in a file as text, each as the profiler's monitor prints it:
-//   print_profile_records FILE
-// The embedded device publishes its time-sync point and its boot time meanwhile.
-
+// print_profile_records FILE: prints the event records of a file as text, in the format of the
+// profiler's monitor. The embedded device provides the time-sync point and the boot time.
 #include <array>
 #include <cstdio>
 #include <cstdlib>
 #include <memory>
 
-#include "nrxctl/base/profile_records.h"
+#include "nrxctl/base/profile_record.h"
 #include "nrxctl/decoders/record_text.h"
 
 int main(int argc, char** argv) {
@@ -17,7 +15,7 @@ int main(int argc, char** argv) {
     if (!file) return EXIT_FAILURE;
     std::array<std::uint8_t, 1024 * nrx::profile_record_size> buffer;
     while (const std::size_t size = std::fread(buffer.data(), 1, buffer.size(), file.get())) {
-        nrx::print_whole_records({buffer.data(), size}, nrx::print_profile_record);
+        nrx::print_complete_records({buffer.data(), size}, nrx::print_profile_record);
     }
     return EXIT_SUCCESS;
 }

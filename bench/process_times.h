@@ -1,4 +1,4 @@
-// What a whole process costs, from exec to exit.
+// Measures whole processes.
 #pragma once
 
 #include <string>
@@ -6,14 +6,14 @@
 
 namespace bench {
 
+// Time and memory from exec to exit.
 struct process_cost {
     double microseconds;
-    double megabytes;  // the most memory it had resident
+    double megabytes;  // peak resident memory
 };
 
-// Runs a program, found as the shell finds it, with the words of a command line; standard output
-// and standard error go to /dev/null, standard input comes from there. Ends this process with
-// status 1, after a message, if the program cannot be started or is ended by a signal.
-process_cost run_once(const std::vector<std::string>& words);
+// Runs a program, looked up in PATH, with its standard streams open on /dev/null. If the program
+// cannot be started or a signal kills it, prints a message and ends this process with status 1.
+process_cost run_once(const std::vector<std::string>& arguments);
 
 }  // namespace bench

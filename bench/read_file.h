@@ -1,4 +1,4 @@
-// The bytes that the measured code works on.
+// Reads input for the code under measurement.
 #pragma once
 
 #include <cstdint>
@@ -6,7 +6,7 @@
 
 namespace bench {
 
-// All bytes of a file; none if it cannot be read.
+// Returns all bytes of a file, or no bytes if it cannot be read.
 std::vector<std::uint8_t> read_file(const char* path);
 
 }  // namespace bench

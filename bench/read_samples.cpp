@@ -1,5 +1,5 @@
-// read_samples FILE: reads a file of sensor samples as a load does before it uploads them: grouped,
-// in order, with their deltas.
+// read_samples FILE: reads a file of sensor samples as a load does before the upload: grouped, in
+// order, with their deltas.
 #include <cstdlib>
 
 #include "nrxctl/replay/sample_file.h"

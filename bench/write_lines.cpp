@@ -1,5 +1,5 @@
-// write_lines COUNT LENGTH: writes COUNT lines of LENGTH characters, one write per line. What it
-// takes is the floor for everything that prints as much a line at a time.
+// write_lines COUNT LENGTH: writes COUNT lines of LENGTH characters, one write per line.
+// Its time is the lower bound for any program that prints as many lines this way.
 #include <cstdlib>
 #include <string>
 

@@ -1,4 +1,4 @@
-# The flags every target of the project is built with, and the functions that declare targets.
+# Compile flags of all targets, and functions that declare targets.
 
 add_library(keyprobe_flags INTERFACE)
 target_compile_features(keyprobe_flags INTERFACE cxx_std_20)
@@ -22,15 +22,15 @@ if(KEYPROBE_COVERAGE)
   target_link_options(keyprobe_flags INTERFACE --coverage)
 endif()
 
-# keyprobe_headers(LIBRARY HEADER...): the headers of a library. Each is compiled on its own too, so
-# that none depends on what was included before it.
+# keyprobe_headers(LIBRARY HEADER...): declares the headers of a library. The target
+# all_verify_interface_header_sets compiles each on its own, which proves that it is self-contained.
 function(keyprobe_headers library)
   target_sources(${library} INTERFACE FILE_SET HEADERS BASE_DIRS "${PROJECT_SOURCE_DIR}" FILES
                                       ${ARGN})
   set_target_properties(${library} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
 endfunction()
 
-# keyprobe_library(NAME SOURCES ... HEADERS ... LINK ...): one static library per folder.
+# keyprobe_library(NAME SOURCES ... HEADERS ... LINK ...): declares the static library of a folder.
 function(keyprobe_library name)
   cmake_parse_arguments(ARG "" "" "SOURCES;HEADERS;LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_SOURCES})
@@ -38,8 +38,8 @@ function(keyprobe_library name)
   target_link_libraries(${name} PUBLIC keyprobe_flags ${ARG_LINK})
 endfunction()
 
-# keyprobe_program(NAME SOURCES ... LINK ...): a program that users start. It is put where
-# scripts/run finds it.
+# keyprobe_program(NAME SOURCES ... LINK ...): declares a program, built in bin/, where
+# scripts/run looks for it.
 function(keyprobe_program name)
   cmake_parse_arguments(ARG "" "" "SOURCES;LINK" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})

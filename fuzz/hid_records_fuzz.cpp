@@ -1,6 +1,6 @@
-// Records of HID devices and of the HID event system, any bytes. The first byte of the input
-// chooses what they are: statistics records, an SPI status record, or the data of a vendor-defined
-// event.
+// Prints any bytes as records of HID devices and of the HID event system. The first byte of the
+// input selects what the rest is: statistics records, an SPI status record, or the data of a
+// vendor-defined event.
 #include <algorithm>
 #include <cstdint>
 #include <vector>
@@ -12,7 +12,7 @@
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     if (size == 0) return 0;
-    // In an allocation of its own, so that a byte read beyond it is found.
+    // A copy in an allocation of its own size, so that a sanitizer finds a read beyond it.
     const std::vector<std::uint8_t> bytes(data + 1, data + size);
     switch (data[0] % 3) {
         case 0:

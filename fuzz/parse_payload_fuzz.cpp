@@ -1,5 +1,5 @@
-// A payload that parse_payload accepts is wholly described by its values. The input is words, one
-// to a line, after a byte that gives the position to begin at.
+// A payload that parse_payload accepts must be fully described by its values. The input is a byte
+// for the first position, then arguments, one per line.
 #include <cstddef>
 #include <cstdint>
 #include <string>
@@ -7,19 +7,19 @@
 #include <utility>
 #include <vector>
 
-#include "fuzz/support/command_line.h"
+#include "fuzz/support/argument_list.h"
 #include "fuzz/support/harness.h"
 #include "nrxctl/base/payload.h"
 
 namespace {
 
-std::size_t width_of(std::string_view word) {
+std::size_t width_for(std::string_view word) {
     if (word == "u16") return 2;
     return word == "u32" ? 4 : 1;
 }
 
-// The payload as words: the width, then each value in decimal.
-fuzz::command_line written(const std::vector<std::uint8_t>& payload, std::size_t width) {
+// The payload as arguments: the width, then each value in decimal.
+fuzz::argument_list format(const std::vector<std::uint8_t>& payload, std::size_t width) {
     std::vector<std::string> words{"u" + std::to_string(8 * width)};
     for (std::size_t offset = 0; offset < payload.size(); offset += width) {
         std::uint32_t value = 0;
@@ -28,27 +28,27 @@ fuzz::command_line written(const std::vector<std::uint8_t>& payload, std::size_t
         }
         words.push_back("0d" + std::to_string(value));
     }
-    return fuzz::command_line(std::move(words));
+    return fuzz::argument_list(std::move(words));
 }
 
-void check_payload(const fuzz::command_line& line, int first, int position,
+void check_payload(const fuzz::argument_list& line, int first, int position,
                    const std::vector<std::uint8_t>& payload) {
     if (first >= line.count()) {
         fuzz::require(position == first && payload.empty());
         return;
     }
-    const auto head = line.word(first);
-    const auto width = width_of(head);
-    const bool named = width > 1 || head == "u8";
-    const auto values = position - first - (named ? 1 : 0);
+    const auto first_word = line.argument(first);
+    const auto width = width_for(first_word);
+    const bool has_width = width > 1 || first_word == "u8";
+    const auto values = position - first - (has_width ? 1 : 0);
     fuzz::require(values >= 0 && position <= line.count());
-    fuzz::require(position == line.count() || line.word(position).starts_with('-'));
+    fuzz::require(position == line.count() || line.argument(position).starts_with('-'));
     fuzz::require(payload.size() == static_cast<std::size_t>(values) * width);
 
-    const auto again = written(payload, width);
+    const auto again = format(payload, width);
     std::vector<std::uint8_t> same;
     int end = 0;
-    fuzz::require(fuzz::completes([&] { nrx::parse_payload(again.words(), end, same); }));
+    fuzz::require(fuzz::completes([&] { nrx::parse_payload(again.arguments(), end, same); }));
     fuzz::require(end == again.count() && same == payload);
 }
 
@@ -56,11 +56,11 @@ void check_payload(const fuzz::command_line& line, int first, int position,
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     if (size == 0) return 0;
-    const fuzz::command_line line = fuzz::words_of(fuzz::as_text(data + 1, size - 1));
+    const fuzz::argument_list line = fuzz::split_arguments(fuzz::as_text(data + 1, size - 1));
     const int first = data[0] % 4;
     int position = first;
-    std::vector<std::uint8_t> payload{0xee};  // what was there before must go
-    if (fuzz::completes([&] { nrx::parse_payload(line.words(), position, payload); })) {
+    std::vector<std::uint8_t> payload{0xee};  // earlier content must go
+    if (fuzz::completes([&] { nrx::parse_payload(line.arguments(), position, payload); })) {
         check_payload(line, first, position, payload);
     }
     return 0;

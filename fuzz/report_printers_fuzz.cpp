@@ -1,5 +1,6 @@
-// Report printers given any bytes. The first byte of the input chooses how the report is printed,
-// the second the report identifier; then the service name up to a line feed, then the report.
+// Report printers with arbitrary bytes. The first byte of the input chooses how the report is
+// printed, the second the report identifier; then the service name up to a line feed, then the
+// report.
 #include <algorithm>
 #include <array>
 #include <cstdint>
@@ -7,15 +8,14 @@
 #include <vector>
 
 #include "fuzz/support/harness.h"
-#include "nrxctl/printers/button_stats.h"
-#include "nrxctl/printers/haptic_assets.h"
-#include "nrxctl/printers/printer_registry.h"
+#include "nrxctl/printers/button_reports.h"
+#include "nrxctl/printers/report_printers.h"
 #include "nrxctl/printers/spi_status.h"
 #include "nrxctl/printers/value_printers.h"
 
 namespace {
 
-void print_record(std::string_view /*service_name*/, std::int32_t /*report_id*/,
+void print_record(std::string_view /*service_name*/, nrx::report_id /*id*/,
                   platform::byte_view report) {
     nrx::print_spi_status(report);
 }
@@ -33,9 +33,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const auto print = printers[data[0] % printers.size()];
     const auto text = fuzz::as_text(data + 2, size - 2);
     const auto service_name = text.substr(0, text.find('\n'));
-    const std::size_t begin = std::min(size, 2 + service_name.size() + 1);
-    // In an allocation of its own, so that a byte read beyond it is found.
-    const std::vector<std::uint8_t> report(data + begin, data + size);
+    const std::size_t report_offset = std::min(size, 2 + service_name.size() + 1);
+    // In an allocation of its own, so that a read beyond it is detected.
+    const std::vector<std::uint8_t> report(data + report_offset, data + size);
     print(service_name, data[1], report);
     return 0;
 }

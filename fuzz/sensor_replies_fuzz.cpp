@@ -1,6 +1,6 @@
-// Any bytes as the replies of a sensor. The first byte of the input chooses the sensor; then each
-// reply follows its identifier and its length, a byte each, or as much of it as there is. Replies
-// with the same identifier make one. The identifier 0xff is the reply that tells the clients.
+// Inspects a sensor whose replies are any bytes. The first byte of the input selects the sensor.
+// The rest is replies: a report id and a length, one byte each, then as many bytes, or fewer at the
+// end of the input. Replies with the same id are joined. The id 0xff stands for the client table.
 #include <algorithm>
 #include <array>
 #include <cstddef>
@@ -23,13 +23,13 @@ constexpr std::uint8_t clients_id = 0xff;
 constexpr std::array sensors{"accel", "gyro", "compass", "als"};
 
 void append_reply(interface_driver& sensor, std::uint8_t id, platform::byte_view part) {
-    const byte_list* before = sensor.report(id);
-    byte_list reply = before == nullptr ? byte_list() : *before;
+    const byte_list* previous = sensor.report(id);
+    byte_list reply = previous == nullptr ? byte_list() : *previous;
     reply.insert(reply.end(), part.begin(), part.end());
     sensor.set_report(id, reply);
 }
 
-void put_replies(interface_driver& sensor, platform::byte_view input) {
+void set_replies(interface_driver& sensor, platform::byte_view input) {
     while (input.size() >= 2) {
         const std::uint8_t id = input[0];
         const std::size_t length = std::min<std::size_t>(input[1], input.size() - 2);
@@ -46,16 +46,16 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     platform::simulated::machine host;
     const platform::simulated::installed_machine installed(host);
     const auto sensor = std::make_shared<interface_driver>();
-    host.add({.name = name, .classes = {"KeltoNRXInterface"}, .unit = sensor});
-    put_replies(*sensor, {data + 1, size - 1});
-    // Without an interval there would be nothing to see.
+    host.add({.name = name, .classes = {"KeltoNRXInterface"}, .driver = sensor});
+    set_replies(*sensor, {data + 1, size - 1});
+    // Without a sample interval nothing else is read.
     if (sensor->report(0) == nullptr) sensor->set_report(0, {0x10, 0x27, 0, 0});
     if (const byte_list* clients = sensor->report(clients_id)) {
         sensor->set_command(0x39, [clients](platform::byte_view, byte_list& reply) {
             reply = *clients;
             return platform::success;
         });
-        // Here in an allocation of its own, so that a byte read beyond it is found.
+        // A copy in an allocation of its own size, so that a sanitizer finds a read beyond it.
         const byte_list entries(clients->begin(), clients->end());
         nrx::print_clients("", entries);
     }

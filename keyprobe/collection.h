@@ -3,9 +3,9 @@
 
 namespace nrx::keyprobe {
 
-// Runs every step of the collection, whatever the steps before it found: button statistics,
-// diagnostic reports, haptic assets, HID feature reports. Each step prints what it reads on
-// standard output and reports its own failures.
+// Prints the button statistics, the diagnostic reports, the haptic assets, and the feature reports
+// of the HID device with usage page 0xFF00 and usage 0x20, on standard output. Each step reports
+// its own failures and does not stop the steps after it.
 void collect_all();
 
 }  // namespace nrx::keyprobe

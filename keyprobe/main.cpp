@@ -2,6 +2,6 @@
 #include "nrxctl/nrxtoollib.h"
 
 int main(int argc, char** argv) {
-    nrx::survive_closed_pipes();
+    const nrx::program_output output;
     return nrx::keyprobe::run(argc, argv);
 }

@@ -16,7 +16,7 @@ constexpr char collect_all_option = 's';
 constexpr std::array long_options{
     option{"collectall", no_argument, nullptr, collect_all_option},
     option{"help", no_argument, nullptr, 'h'},
-    option{nullptr, 0, nullptr, 0},
+    option{},
 };
 
 [[noreturn]] void print_usage(const char* program_name) {
@@ -30,11 +30,10 @@ constexpr std::array long_options{
 
 int run(int argc, char** argv) {
     if (argc == 0) print_usage("keyprobe");
-    ::unsetenv("POSIXLY_CORRECT");  // would end the parsing at the first word that is no option
-    optind = 0;  // the parser starts afresh, also when this is not the first run in the process
+    ::unsetenv("POSIXLY_CORRECT");  // would end the parsing at the first argument that is no option
+    optind = 0;                     // resets the parser, which an earlier run may have used
     while (true) {
-        // The letters are known to the parser and refused here like any other option: only
-        // unknown ones get a message of the parser's own before the usage line.
+        // The parser knows these letters, so it prints no message of its own before the usage line.
         const int option = getopt_long(argc, argv, "bf:", long_options.data(), nullptr);
         if (option == -1) return EXIT_SUCCESS;
         if (option != collect_all_option) print_usage(argv[0]);

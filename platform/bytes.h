@@ -1,4 +1,4 @@
-// Byte ranges as they are handed over the platform seam.
+// Byte ranges that cross the platform seam.
 #pragma once
 
 #include <cstdint>
@@ -6,10 +6,10 @@
 
 namespace platform {
 
-// Bytes that are only read.
+// Bytes to read.
 using byte_view = std::span<const std::uint8_t>;
 
-// Room that is filled by the callee.
+// A buffer that the callee fills.
 using byte_span = std::span<std::uint8_t>;
 
 }  // namespace platform

@@ -7,22 +7,23 @@
 
 namespace platform {
 
-// Ticks of the monotonic clock.
+// Current time of the monotonic clock, in ticks.
 std::uint64_t ticks();
 
-// Seconds from one tick to the next; the same for the whole life of the process.
+// Duration of a tick in seconds. Does not change while the process lives.
 double tick_period();
 
-// Sleeps. The interrupt handler runs inside, and the sleep then goes on to its end.
+// Sleeps for the whole duration. An interrupt wakes the sleep, its handler runs, and the sleep
+// resumes.
 void sleep(std::chrono::microseconds duration);
 
-// An instant since 1970, UTC.
+// A time since 1970, UTC.
 struct calendar_instant {
     std::int64_t seconds;
     std::int64_t microseconds;
 };
 
-// One instant on the monotonic clock and on the wall clock.
+// The same instant on the monotonic clock and on the wall clock.
 struct clock_reading {
     std::uint64_t ticks;
     calendar_instant wall;
@@ -31,8 +32,8 @@ struct clock_reading {
 // Reads both clocks at once.
 clock_reading read_clocks();
 
-// When the host was started: the same instant as long as the process lives. None if the host does
-// not tell.
+// The time at which the host booted. Does not change while the process lives. Returns nullopt if
+// the host does not provide it.
 std::optional<calendar_instant> boot_time();
 
 }  // namespace platform

@@ -1,4 +1,4 @@
-// The shape of every object that the host lends to the tool.
+// Owning handles of host objects.
 #pragma once
 
 #include <cstdint>
@@ -6,10 +6,11 @@
 
 namespace platform {
 
-// How the host numbers the objects that it lends out; 0 is none.
+// Identifies an object that is open on the host; 0 means no object.
 using handle_id = std::uint32_t;
 
-// A move-only owner of one host object. Kind::release(id) gives the object back; it never fails.
+// Move-only owner of a host object. The destructor releases the object through Kind::release, which
+// never fails.
 template <class Kind>
 class handle {
 public:
@@ -27,12 +28,12 @@ public:
     handle& operator=(const handle&) = delete;
     ~handle() { reset(); }
 
-    // Whether there is an object.
+    // Returns true if the handle owns an object.
     explicit operator bool() const { return id_ != 0; }
 
     [[nodiscard]] handle_id id() const { return id_; }
 
-    // Gives the object back now.
+    // Releases the object now.
     void reset() {
         if (id_ != 0) Kind::release(std::exchange(id_, 0));
     }

@@ -6,12 +6,12 @@
 
 namespace platform {
 
-// The types of event that the tool tells apart.
+// Event types.
 inline constexpr std::uint32_t null_event = 0;
 inline constexpr std::uint32_t vendor_defined_event = 1;
 inline constexpr std::uint32_t accelerometer_event = 13;
 
-// Fields of an accelerometer event: the acceleration, then three integers.
+// Fields of an accelerometer event: three reals, then three integers.
 inline constexpr std::uint32_t accelerometer_x = 0xd0000;
 inline constexpr std::uint32_t accelerometer_y = 0xd0001;
 inline constexpr std::uint32_t accelerometer_z = 0xd0002;
@@ -19,7 +19,7 @@ inline constexpr std::uint32_t accelerometer_type = 0xd0003;
 inline constexpr std::uint32_t accelerometer_subtype = 0xd0004;
 inline constexpr std::uint32_t accelerometer_sequence = 0xd0005;
 
-// One event. Plain value semantics: a copy shares nothing with its source.
+// An event. Copies share nothing with the original.
 struct hid_event {
     template <class Number>
     struct field {
@@ -27,30 +27,30 @@ struct hid_event {
         Number value;
     };
 
-    // When it happened, in ticks of the monotonic clock.
+    // Time of the event, in ticks of the monotonic clock.
     std::uint64_t ticks = 0;
     std::uint32_t type = null_event;
-    // How long after that it was handed over.
+    // Time from the event to its delivery.
     std::int64_t latency_nanoseconds = 0;
     std::vector<field<std::int64_t>> integers = {};
-    std::vector<field<double>> fractions = {};
-    // What a vendor-defined event carries.
+    std::vector<field<double>> reals = {};
+    // Payload of a vendor-defined event.
     std::vector<std::uint8_t> vendor_data = {};
 
-    // The latency in units of so many nanoseconds, which are more than 0, rounded towards 0.
+    // The latency in units of scale nanoseconds, rounded towards 0; scale is positive.
     [[nodiscard]] std::int64_t latency(std::int64_t scale) const {
         return latency_nanoseconds / scale;
     }
 
-    // The value of a field; 0 if the event has no such field.
+    // Value of a field; 0 if the event has no such field.
     [[nodiscard]] std::int64_t integer(std::uint32_t id) const { return value_of(integers, id); }
-    [[nodiscard]] double fraction(std::uint32_t id) const { return value_of(fractions, id); }
+    [[nodiscard]] double real(std::uint32_t id) const { return value_of(reals, id); }
 
 private:
     template <class Number>
     static Number value_of(const std::vector<field<Number>>& fields, std::uint32_t id) {
-        for (const auto& one : fields) {
-            if (one.id == id) return one.value;
+        for (const auto& candidate : fields) {
+            if (candidate.id == id) return candidate.value;
         }
         return Number{0};
     }

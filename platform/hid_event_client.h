@@ -1,4 +1,4 @@
-// The tool as a client of the host's HID event system.
+// Clients of the host's HID event system.
 #pragma once
 
 #include <functional>
@@ -14,34 +14,35 @@ struct hid_event_client_kind {
     static void release(handle_id id);
 };
 
-// A client of the event system; released by whoever holds it, which takes it off the event loop.
+// A client of the event system. Releasing it removes it from the event loop.
 using hid_event_client = handle<hid_event_client_kind>;
 
 struct hid_service_list_kind {
     static void release(handle_id id);
 };
 
-// A list of the HID services that a client sees; released by whoever holds it.
+// A list of the HID services that a client sees.
 using hid_service_list = handle<hid_service_list_kind>;
 
-// A client of the event system; none if the host has no such system. The caller owns it.
+// Creates a client. Returns an empty handle if the host has no HID event system.
 hid_event_client create_hid_event_client();
 
-// Each installs what is called, in place of an earlier callback: with an event; after the event
-// system was reset; with the records of a statistics update of the firmware, back to back, which
-// are kept until the end of the callback. Fails with not_found if there is no such client, and with
-// the host's code.
+// Callbacks of a client: for each event, after a reset of the event system, and for each statistics
+// update of the firmware. An update is passed as its records back to back, which stay valid until
+// the callback returns. Each function replaces the previous callback. They fail with not_found if
+// the client handle is empty, and with the host's code.
 return_code set_event_callback(const hid_event_client& client,
                                std::function<void(const hid_event& event)> callback);
 return_code set_reset_callback(const hid_event_client& client, std::function<void()> callback);
 return_code set_statistics_callback(const hid_event_client& client,
                                     std::function<void(byte_view records)> callback);
 
-// Lets the client call back from the event loop of this thread. Fails as the above.
+// Schedules the callbacks of the client on the event loop of this thread. Fails like the functions
+// above.
 return_code schedule_on_loop(const hid_event_client& client);
 
-// The list of the HID services that are there now; none if there is no such client or the host has
-// none to give. The caller owns it.
-hid_service_list services_of(const hid_event_client& client);
+// Lists the HID services that are present. Returns an empty handle if the client handle is empty or
+// the host cannot provide a list.
+hid_service_list list_hid_services(const hid_event_client& client);
 
 }  // namespace platform

@@ -3,18 +3,17 @@
 
 namespace platform {
 
-// What to do about an interrupt. It may make platform calls.
+// Called for an interrupt. It may make platform calls.
 using interrupt_handler = void (*)();
 
-// Registers a handler in place of the default action, which ends the process. An interrupt is only
-// noted when it comes in; the handler runs on the calling thread at its next safe point: inside a
-// wait or a sleep, which an interrupt wakes at once, or when a platform call that can fail returns.
-// Interrupts that come in before the handler runs are one; one that comes in while it runs makes it
-// run again.
-void handle_interrupt(interrupt_handler handler);
+// Replaces the default action, which ends the process, with a handler. The signal itself only sets
+// a flag. The handler runs on the calling thread at its next safe point: when a platform call that
+// can fail returns, or during a wait or a sleep, which an interrupt wakes at once. Interrupts that
+// arrive before the handler runs are handled once; one that arrives while it runs makes it run
+// again.
+void set_interrupt_handler(interrupt_handler handler);
 
-// Gives the interrupt its default action back. An interrupt noted before still gets its handler,
-// now.
+// Restores the default action. An interrupt that is still pending is handled first.
 void restore_default_interrupt();
 
 }  // namespace platform

@@ -19,21 +19,21 @@ dictionary::dictionary(std::initializer_list<dictionary_entry> entries) {
 }
 
 void dictionary::set(std::string_view key, property value) {
-    const auto found =
+    const auto match =
         std::find_if(entries_.begin(), entries_.end(),
                      [&](const dictionary_entry& entry) { return entry.key == key; });
-    if (found == entries_.end()) {
+    if (match == entries_.end()) {
         entries_.push_back({std::string(key), std::move(value)});
     } else {
-        found->value = std::move(value);
+        match->value = std::move(value);
     }
 }
 
 const property* dictionary::find(std::string_view key) const {
-    const auto found =
+    const auto match =
         std::find_if(entries_.begin(), entries_.end(),
                      [&](const dictionary_entry& entry) { return entry.key == key; });
-    return found == entries_.end() ? nullptr : &found->value;
+    return match == entries_.end() ? nullptr : &match->value;
 }
 
 std::optional<std::int64_t> property::number() const {

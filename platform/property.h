@@ -1,4 +1,4 @@
-// Property values of the driver registry: numbers, texts, arrays and dictionaries.
+// Property values of the driver registry: numbers, text, arrays and dictionaries.
 #pragma once
 
 #include <cstdint>
@@ -17,7 +17,7 @@ struct dictionary_entry;
 
 using array = std::vector<property>;
 
-// Keys with their values, in the order in which the keys were first set. Copies are deep.
+// Keys and values, in the order in which the keys were first set. Copies are deep.
 class dictionary {
 public:
     dictionary();
@@ -28,10 +28,10 @@ public:
     dictionary& operator=(dictionary&& other) noexcept;
     ~dictionary();
 
-    // Sets the value of a key, replacing an earlier one.
+    // Sets the value of a key, replacing an existing value.
     void set(std::string_view key, property value);
 
-    // The value of a key, owned by the dictionary; null if the key is not there.
+    // Value of a key, owned by the dictionary; null if there is no such key.
     [[nodiscard]] const property* find(std::string_view key) const;
 
     [[nodiscard]] const std::vector<dictionary_entry>& entries() const { return entries_; }
@@ -40,7 +40,7 @@ private:
     std::vector<dictionary_entry> entries_;
 };
 
-// One value. Plain value semantics: a copy shares nothing with its source.
+// A value. Copies share nothing with the original.
 class property {
 public:
     property(std::int32_t value) : value_(value) {}
@@ -51,10 +51,10 @@ public:
     property(array value) : value_(std::move(value)) {}
     property(dictionary value) : value_(std::move(value)) {}
 
-    // The value of a number of either width; none for anything else.
+    // The number, of either width; nullopt for any other kind of value.
     [[nodiscard]] std::optional<std::int64_t> number() const;
 
-    // The value if it is of that kind, owned by the property; null otherwise.
+    // The value, owned by the property; null for any other kind of value.
     [[nodiscard]] const std::string* text() const { return std::get_if<std::string>(&value_); }
     [[nodiscard]] const array* items() const { return std::get_if<array>(&value_); }
     [[nodiscard]] const dictionary* entries() const { return std::get_if<dictionary>(&value_); }
@@ -68,12 +68,12 @@ struct dictionary_entry {
     property value;
 };
 
-// Whether two values are the same: numbers by value whatever their width, arrays item by item,
-// dictionaries key by key in any order.
+// Returns true if two values are equal. Numbers are compared by value regardless of their width,
+// arrays item by item, dictionaries key by key in any order.
 bool same_value(const property& a, const property& b);
 
-// The value as text on one line: numbers in decimal, texts in double quotes and with full stops for
-// control characters, arrays as (a, b), dictionaries as {key = value; key = value}.
+// Formats a value on one line: numbers in decimal, text in double quotes with a dot for each
+// control character, arrays as (a, b), dictionaries as {key = value; key = value}.
 std::string describe(const property& value);
 
 }  // namespace platform

@@ -1,4 +1,4 @@
-// The host's registry of drivers: look-up, entry names, properties.
+// The host's driver registry: look-up, entry names, properties.
 #pragma once
 
 #include <optional>
@@ -16,50 +16,52 @@ struct service_kind {
     static void release(handle_id id);
 };
 
-// A reference to one registry entry; released by whoever holds it.
+// A reference to a registry entry.
 using service = handle<service_kind>;
 
-// The keys that a look-up understands. All keys that are given must match; any other key matches
+// Keys of a matching dictionary. An entry matches if every key matches; an unknown key matches
 // nothing.
-inline constexpr std::string_view provider_class_key = "IOProviderClass";  // class or a base of it
+inline constexpr std::string_view provider_class_key = "IOProviderClass";  // class or base class
 inline constexpr std::string_view name_match_key = "IONameMatch";          // registry name
-inline constexpr std::string_view property_match_key = "IOPropertyMatch";  // property -> value
-inline constexpr std::string_view location_id_key = "LocationID";          // property of that name
-inline constexpr std::string_view usage_pairs_key = "DeviceUsagePairs";    // any pair in common
+inline constexpr std::string_view property_match_key = "IOPropertyMatch";  // names and values
+inline constexpr std::string_view location_id_key = "LocationID";          // property "LocationID"
+inline constexpr std::string_view usage_pairs_key = "DeviceUsagePairs";    // any common pair
 inline constexpr std::string_view usage_page_key = "DeviceUsagePage";      // inside a pair
 inline constexpr std::string_view usage_key = "DeviceUsage";               // inside a pair
 
-// The plane that relates drivers to the drivers attached to them.
+// The registry plane in which a driver's clients are its children.
 inline constexpr std::string_view service_plane = "IOService";
 
-// A matching dictionary for the services of a class.
-dictionary matching_class(std::string_view class_name);
+// Returns a matching dictionary for the services of a class.
+inline dictionary matching_class(std::string_view class_name) {
+    return {{std::string(provider_class_key), class_name}};
+}
 
-// The first service, in registration order, that matches; none if there is none. The caller owns
-// it.
+// Finds the first matching service in registration order. Returns an empty handle if none matches.
 service first_match(const dictionary& matching);
 
-// Every service that matches, in registration order, into found. The caller owns them. Fails with
-// the host's code if the registry cannot be enumerated; found is then untouched. No match is a
-// success with nothing found.
-return_code all_matches(const dictionary& matching, std::vector<service>& found);
+// Replaces the contents of services with every matching service in registration order, possibly
+// none. Fails with the host's code if the registry cannot be enumerated; services is then
+// unchanged.
+return_code all_matches(const dictionary& matching, std::vector<service>& services);
 
-// The first child of an entry in a plane; none if it has none or is gone. The caller owns it.
+// Finds the first child of an entry in a plane. Returns an empty handle if the entry has no
+// children or is gone.
 service first_child(const service& parent, std::string_view plane);
 
-// The registry name of an entry, at most 127 characters, into name. Fails with not_found if the
-// entry is gone; name is then untouched.
+// Stores the registry name of an entry, at most 127 characters, in name. Fails with not_found if
+// the entry is gone; name is then unchanged.
 return_code entry_name(const service& entry, std::string& name);
 
-// A copy of an entry's property; none if there is no such property or the entry is gone.
+// Returns a copy of a property; nullopt if there is no such property or the entry is gone.
 std::optional<property> read_property(const service& entry, std::string_view name);
 
-// The same, into value, for those who read a property over and over: the room that value has is
-// used again. False, and value untouched, if there is none.
+// Like the above, but stores the property in value and reuses its memory, for callers that read a
+// property repeatedly. Returns false and leaves value unchanged if there is no such property.
 bool read_property(const service& entry, std::string_view name, property& value);
 
-// Sets an entry's property. Fails with not_found if the entry is gone and with unsupported if its
-// driver takes no properties.
+// Sets a property. Fails with not_found if the entry is gone, and with unsupported if its driver
+// does not accept properties.
 return_code set_property(const service& entry, std::string_view name, const property& value);
 
 }  // namespace platform

@@ -1,4 +1,4 @@
-// The event loop of the calling thread: what is scheduled on it calls back from inside of a run.
+// The event loop of the calling thread. Scheduled objects call back while it runs.
 #pragma once
 
 #include <chrono>
@@ -7,18 +7,17 @@
 
 namespace platform {
 
-// Runs the loop until it is stopped: everything that comes about on it calls back, one after the
-// other in the order of the times at which it comes about. In between the run blocks without using
-// the processor, and an interrupt wakes it at once; the interrupt handler runs inside, and may stop
-// the loop. Fails with the host's code if nothing can ever call back or end the run.
+// Runs the loop until it is stopped. Callbacks are made one at a time, in the order of their due
+// times. Between callbacks the loop blocks without using the processor. An interrupt wakes it at
+// once; the interrupt handler runs inside the loop and may stop it. Fails with the host's code if
+// nothing can ever call back or end the run.
 return_code run_loop();
 
-// The same for so long at most: what comes about later does not call back any more.
+// Like run_loop, but ends after the given duration. Callbacks due later are not made.
 return_code run_loop_for(std::chrono::microseconds duration);
 
-// Stops the loop: no further callback is made. A stop is never lost: one that comes while the loop
-// does not run ends its next run before the first callback. It ends one run; several stops that
-// come before one is served are one.
+// Stops the loop before its next callback. A stop is never lost: if the loop is not running, its
+// next run ends before the first callback. Each run serves all stops that are pending.
 void stop_loop();
 
 }  // namespace platform

@@ -1,4 +1,4 @@
-# What the scripts share. Sourced, never run; needs bash with `set -euo pipefail`.
+# Functions and variables shared by the scripts. Source it in bash with `set -euo pipefail`.
 # shellcheck shell=bash disable=SC2034
 
 root=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
@@ -9,7 +9,7 @@ readonly build_packages=(g++ cmake ninja-build)
 readonly clang_packages=(clang-14 libclang-rt-14-dev "${build_packages[@]}")
 readonly test_packages=(libgtest-dev)
 
-# Scripts talk on standard error: standard output belongs to what they run.
+# Messages go to standard error; standard output belongs to the program that a script runs.
 say() {
     printf '%s: %s\n' "$script" "$*" >&2
 }
@@ -26,14 +26,14 @@ is_installed() {
 apt() {
     local -a sudo=()
     if ((EUID != 0)); then
-        command -v sudo >/dev/null || die "not root, and there is no sudo: install $* by hand"
+        command -v sudo >/dev/null || die "not root, and sudo is not installed: run as root: apt-get $*"
         sudo=(sudo)
     fi
     "${sudo[@]}" env DEBIAN_FRONTEND=noninteractive \
         apt-get -qq -o DPkg::Lock::Timeout=300 "$@" </dev/null >&2
 }
 
-# ensure_packages NAME...: installs those Debian packages that are missing.
+# ensure_packages NAME...: installs the Debian packages that are missing.
 ensure_packages() {
     local -a missing=()
     local name
@@ -41,15 +41,15 @@ ensure_packages() {
         is_installed "$name" || missing+=("$name")
     done
     ((${#missing[@]})) || return 0
-    command -v apt-get >/dev/null || die "needs a Debian machine, or these packages: ${missing[*]}"
+    command -v apt-get >/dev/null || die "this is not a Debian machine; install these packages yourself: ${missing[*]}"
     say "installing ${missing[*]}"
     if ! apt install --simulate --no-install-recommends "${missing[@]}" &>/dev/null; then
-        apt update || die "the package lists cannot be refreshed"
+        apt update || die "cannot update the package lists"
     fi
     apt install -y --no-install-recommends "${missing[@]}" || die "cannot install ${missing[*]}"
 }
 
-# quietly COMMAND...: runs a command whose output matters only if it fails.
+# quietly COMMAND...: runs a command and shows its output only if it fails.
 quietly() {
     local output
     output=$("$@" 2>&1 </dev/null) || {
@@ -58,28 +58,28 @@ quietly() {
     }
 }
 
-# configure PRESET [CMAKE WORDS...]: brings the folder of the preset in line with it.
+# configure PRESET [CMAKE ARGUMENT...]: configures the build folder of the preset.
 configure() {
     quietly cmake -S "$root" --preset "$@" || die "cannot configure the preset $1"
 }
 
-# build PRESET [TARGET...]: builds what is out of date in build/PRESET. Quiet if nothing is. A preset
-# that builds in the folder of another one (fuzz in asan's, bench in test's) goes by its name here.
+# build PRESET [TARGET...]: builds what is out of date in build/PRESET; prints nothing if everything is
+# up to date. For a preset that shares another's folder (fuzz: asan, bench: test), pass that other one.
 build() {
     local preset=$1
     shift
-    local -a words=(--build "$root/build/$preset" -j "$jobs")
-    (($#)) && words+=(--target "$@")
+    local -a arguments=(--build "$root/build/$preset" -j "$jobs")
+    (($#)) && arguments+=(--target "$@")
     local plan
-    plan=$(cmake "${words[@]}" -- -n 2>&1) || {
+    plan=$(cmake "${arguments[@]}" -- -n 2>&1) || {
         printf '%s\n' "$plan" >&2
         return 1
     }
     [[ $plan == *"no work to do"* ]] && return
     say "building ${*:-everything} (preset $preset)"
     if [[ -t 2 ]]; then
-        cmake "${words[@]}" >&2
+        cmake "${arguments[@]}" >&2
     else
-        cmake "${words[@]}" -- --quiet >&2
+        cmake "${arguments[@]}" -- --quiet >&2
     fi
 }

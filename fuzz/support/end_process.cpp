@@ -1,4 +1,4 @@
-// Stands in for the library's end of the process: fuzzing goes on after it.
+// Replaces the library's end_process: throws, so that fuzzing can continue.
 #include "nrxctl/base/end_process.h"
 
 #include "fuzz/support/harness.h"

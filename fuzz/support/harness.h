@@ -1,4 +1,4 @@
-// What fuzz targets share.
+// Helpers shared by the fuzz targets.
 #pragma once
 
 #include <cstddef>
@@ -8,15 +8,15 @@
 
 namespace fuzz {
 
-// Thrown where the code under test would have ended the process.
+// Thrown in place of ending the process.
 struct process_ended {};
 
-// Stops the fuzzer, which keeps the input, if what must hold does not.
-inline void require(bool holds) {
-    if (!holds) std::abort();
+// Aborts if the condition is false; the fuzzer then saves the input.
+inline void require(bool condition) {
+    if (!condition) std::abort();
 }
 
-// Runs an action; whether it came to its end, that is, did not end the process.
+// Runs an action. Returns false if it tried to end the process.
 template <class Action>
 bool completes(const Action& action) {
     try {

@@ -2,23 +2,30 @@
 
 #include <utility>
 
-#include "nrxctl/base/failure_report.h"
-#include "nrxctl/base/open_connection.h"
-#include "nrxctl/base/service_discovery.h"
+#include "nrxctl/base/check.h"
+#include "nrxctl/base/services.h"
 
 namespace nrx {
 
-platform::return_code open_channel(platform::service found, std::uint32_t type, channel& opened) {
-    opened.service = std::move(found);
-    if (!check(opened.service, "service")) return platform::not_found;
-    return open_connection(opened.service, type, opened.connect);
+platform::return_code open_connection(const platform::service& service, std::uint32_t type,
+                                      platform::connection& connection, source_location location) {
+    const platform::return_code kr = platform::open(service, type, connection);
+    if (!check_success(kr, condition::kr_is_zero, location)) return kr;
+    return check(connection, "connect", location) ? platform::success : platform::no_memory;
 }
 
-platform::return_code open_channel(std::string_view service_name, channel& opened,
-                                   expected_failure missing) {
-    platform::service found = find_service(service_name);
-    if (!found && missing == expected_failure::is_silent) return platform::not_found;
-    return open_channel(std::move(found), 0, opened);
+platform::return_code open_channel(platform::service service, std::uint32_t type,
+                                   service_channel& opened) {
+    opened.service = std::move(service);
+    if (!check(opened.service, condition::service)) return platform::not_found;
+    return open_connection(opened.service, type, opened.connection);
+}
+
+platform::return_code open_channel(std::string_view service_name, service_channel& opened,
+                                   on_failure on_missing) {
+    platform::service service = find_service(service_name);
+    if (!service && on_missing == on_failure::ignore) return platform::not_found;
+    return open_channel(std::move(service), 0, opened);
 }
 
 }  // namespace nrx

@@ -1,4 +1,4 @@
-// A connection to a named interface service, for the length of one operation.
+// A connection to an interface service for the length of one operation.
 #pragma once
 
 #include <cstdint>
@@ -11,20 +11,26 @@
 namespace nrx {
 
 // The connection is closed before the service is released.
-struct channel {
+struct service_channel {
     platform::service service;
-    platform::connection connect;
+    platform::connection connection;
 };
 
-// Opens a connection of the given type on a service that was looked up before. Fails, with a
-// failure report for the check that did not hold, with not_found if the look-up found none, the
-// platform's code if the service cannot be opened, and no_memory if opening hands back no
-// connection.
-platform::return_code open_channel(platform::service found, std::uint32_t type, channel& opened);
+// Opens a connection of the given type on a service. Fails with a failure report that names the
+// caller's location: with the platform's code if the service cannot be opened, and with no_memory
+// if the platform returns no connection.
+platform::return_code open_connection(const platform::service& service, std::uint32_t type,
+                                      platform::connection& connection,
+                                      source_location location = source_location::current());
 
-// Finds a service by name and opens a connection of type 0 on it. Fails as the above does, but for
-// a missing service silently if so asked.
-platform::return_code open_channel(std::string_view service_name, channel& opened,
-                                   expected_failure missing = expected_failure::is_reported);
+// Opens a channel of the given connection type on a service that was looked up before. Fails with a
+// failure report: with not_found if the service is empty, otherwise as open_connection does.
+platform::return_code open_channel(platform::service service, std::uint32_t type,
+                                   service_channel& opened);
+
+// Finds a service by name and opens a channel of type 0 on it. Fails as above; a missing service is
+// reported or not as on_missing says.
+platform::return_code open_channel(std::string_view service_name, service_channel& opened,
+                                   on_failure on_missing = on_failure::report);
 
 }  // namespace nrx

@@ -2,9 +2,12 @@
 
 #include <cstdlib>
 
+#include "nrxctl/base/output.h"
+
 namespace nrx {
 
 void end_process() {
+    flush_output();
     std::exit(EXIT_FAILURE);
 }
 

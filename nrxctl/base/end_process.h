@@ -1,10 +1,10 @@
-// The one place where the library ends the process with a status.
+// The only place where the library ends the process.
 #pragma once
 
 namespace nrx {
 
-// Ends the process with status 1. Stands in an object file of its own, so that a test or fuzz
-// harness can link another definition, one that throws.
+// Ends the process with status 1. Defined in an object file of its own, so that test and fuzz
+// programs can link a definition that throws instead.
 [[noreturn]] void end_process();
 
 }  // namespace nrx

@@ -9,7 +9,7 @@ namespace nrx {
 
 namespace {
 
-const char* text_or_nothing(const char* text) {
+const char* text_or_empty(const char* text) {
     return text == nullptr ? "" : text;
 }
 
@@ -22,7 +22,7 @@ void append_part(text_line& report, const char* part) {
 void report_failure(const char* label, const char* condition, const char* exit_label,
                     const char* message, const char* file, int line, platform::return_code code) {
     text_line report;
-    report.text("Assertion failed: ").text(text_or_nothing(label)).text(": ");
+    report.text("Assertion failed: ").text(text_or_empty(label)).text(": ");
     if (condition != nullptr) report.text("Check failed: ");
     append_part(report, condition);
     append_part(report, exit_label);
@@ -36,8 +36,9 @@ void report_failure(const char* label, const char* condition, const char* exit_l
 }
 
 bool check_as(const char* label, bool holds, const char* condition, platform::return_code code,
-              source_place place) {
-    if (!holds) report_failure(label, condition, "bail", nullptr, place.file, place.line, code);
+              source_location location) {
+    if (!holds)
+        report_failure(label, condition, "bail", nullptr, location.file, location.line, code);
     return holds;
 }
 

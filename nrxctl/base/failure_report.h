@@ -1,43 +1,50 @@
-// Failure reports, and the checks that write them.
+// Failure reports: one line on standard error for each check that does not hold.
 //
-// An operation checks what it depends on; a check that does not hold writes one report, and the
-// caller returns. Handles release themselves on the way out.
+// A check reports and returns false; the caller returns, and its handles release what they own.
 #pragma once
 
-#include "nrxctl/base/source_place.h"
 #include "platform/return_code.h"
 
 namespace nrx {
 
-// The label of reports that the tool library writes.
-inline constexpr const char* library_label = "nrxtoollib";
+// A position in the source. Stands in for std::source_location, which clang 14 lacks.
+struct source_location {
+    const char* file;  // path from the root of the repository
+    int line;
+
+    // As a default argument: the position of the call.
+    static constexpr source_location current(const char* file = __builtin_FILE(),
+                                             int line = __builtin_LINE()) {
+        return {file, line};
+    }
+};
 
 // Writes one failure report, a line, on standard error:
 //   Assertion failed: <label>: Check failed: <condition> <exit label> <message> <file>:<line> <text
 //   of the code> (0x<code>)
-// Texts that are null, a line of 0 and a code of 0 leave their part out.
+// Null texts, a line of 0 and a code of 0 leave their part out.
 void report_failure(const char* label, const char* condition, const char* exit_label,
                     const char* message, const char* file, int line, platform::return_code code);
 
-// A check as a subsystem with the given label makes it: answers whether the condition holds, and
-// reports it if not. Conditions are named as a reader of the report expects them.
+// Reports a failed check of the subsystem with the given label unless the condition holds. Returns
+// holds. The text of the condition is what a reader of the report expects, not C++.
 bool check_as(const char* label, bool holds, const char* condition, platform::return_code code,
-              source_place place);
+              source_location location);
 
-// Checks of the library. The first is for a handle, an object or any other condition; the second
-// for a return code, whose condition is the variable's name and " == 0 ".
-template <class Condition>
-bool check(const Condition& condition, const char* text,
-           source_place place = source_place::here()) {
-    return check_as(library_label, static_cast<bool>(condition), text, platform::success, place);
-}
-inline bool check_success(platform::return_code code, const char* text,
-                          source_place place = source_place::here()) {
-    return check_as(library_label, code == platform::success, text, code, place);
-}
+// Condition texts that recur. Readers of failure reports search for them, so the ones that differ
+// in a name or a trailing space are kept apart.
+namespace condition {
 
-// What an operation does about the one failure that its caller may foresee, such as a service that
-// is not there.
-enum class expected_failure { is_reported, is_silent };
+inline constexpr const char* kr_is_zero = "kr == 0 ";
+inline constexpr const char* kr_is_zero_without_space = "kr == 0";
+inline constexpr const char* result_is_zero = "result == 0 ";
+inline constexpr const char* success = "success";
+inline constexpr const char* service = "service";
+inline constexpr const char* arguments_remain = "argc > optind";
+
+}  // namespace condition
+
+// What an operation does about a failure that its caller expects, such as a missing service.
+enum class on_failure { report, ignore };
 
 }  // namespace nrx

@@ -4,8 +4,8 @@
 #include <array>
 #include <cstddef>
 
-#include "nrxctl/base/hex_digits.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/text_line.h"
 
 namespace nrx {
 
@@ -15,11 +15,11 @@ constexpr std::size_t bytes_per_line = 16;
 constexpr std::size_t bytes_before_gap = 8;
 constexpr std::string_view separator = " | ";
 
-// Label and blank, "oooooooo: ", the pairs and their gap, the separator, the characters and their
-// gap, the line feed.
+// After label and space: "oooooooo: ", the pairs and their gap, the separator, the characters and
+// their gap, the line feed.
 constexpr std::size_t columns = 10 + 3 * bytes_per_line + 1 + 3 + bytes_per_line + 1 + 1;
-constexpr std::size_t longest_line = 256;
-static_assert(longest_dump_label + 1 + columns <= longest_line);
+constexpr std::size_t max_line = 256;
+static_assert(max_dump_label + 1 + columns <= max_line);
 
 // "xx " for every byte value, and the character that stands for it.
 constexpr auto pairs = [] {
@@ -37,43 +37,44 @@ constexpr auto characters = [] {
     return table;
 }();
 
-char* put(char* to, std::string_view text) {
-    return std::copy(text.begin(), text.end(), to);
+char* write(char* target, std::string_view text) {
+    return std::copy(text.begin(), text.end(), target);
 }
 
-char* put_offset(char* to, std::size_t offset) {
+char* write_offset(char* target, std::size_t offset) {
     for (int shift = 28; shift >= 0; shift -= 4) {
-        *to++ = hex_digits[offset >> shift & 0xf];
+        *target++ = hex_digits[offset >> shift & 0xf];
     }
-    return put(to, ": ");
+    return write(target, ": ");
 }
 
-char* put_pairs(char* to, platform::byte_view bytes) {
+char* write_pairs(char* target, platform::byte_view bytes) {
     for (std::size_t i = 0; i < bytes_per_line; ++i) {
-        to = i < bytes.size() ? std::copy_n(pairs[bytes[i]].data(), 3, to) : put(to, "   ");
-        if (i + 1 == bytes_before_gap) *to++ = ' ';
+        target = i < bytes.size() ? std::copy_n(pairs[bytes[i]].data(), 3, target)
+                                  : write(target, "   ");
+        if (i + 1 == bytes_before_gap) *target++ = ' ';
     }
-    return to;
+    return target;
 }
 
-char* put_characters(char* to, platform::byte_view bytes) {
+char* write_characters(char* target, platform::byte_view bytes) {
     for (std::size_t i = 0; i < bytes.size(); ++i) {
-        *to++ = characters[bytes[i]];
-        if (i + 1 == bytes_before_gap) *to++ = ' ';
+        *target++ = characters[bytes[i]];
+        if (i + 1 == bytes_before_gap) *target++ = ' ';
     }
-    return to;
+    return target;
 }
 
 }  // namespace
 
 void hex_dump(platform::byte_view bytes, std::string_view label) {
-    std::array<char, longest_line> line;
+    std::array<char, max_line> line;
     char* start = line.data();
-    if (!label.empty()) start = put(put(start, label.substr(0, longest_dump_label)), " ");
+    if (!label.empty()) start = write(write(start, label.substr(0, max_dump_label)), " ");
     for (std::size_t offset = 0; offset < bytes.size(); offset += bytes_per_line) {
         const auto row = bytes.subspan(offset, std::min(bytes_per_line, bytes.size() - offset));
-        char* end = put_pairs(put_offset(start, offset), row);
-        end = put_characters(put(end, separator), row);
+        char* end = write_pairs(write_offset(start, offset), row);
+        end = write_characters(write(end, separator), row);
         *end++ = '\n';
         write_output({line.data(), static_cast<std::size_t>(end - line.data())});
     }

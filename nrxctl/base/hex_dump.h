@@ -8,11 +8,11 @@
 namespace nrx {
 
 // Writes bytes on standard output, 16 to a line: the offset in eight hexadecimal digits, the bytes
-// in hexadecimal, and as characters (a full stop for blanks, control characters and everything from
-// 0x7f up). A label, if not empty, and a blank begin each line; a label longer than a dump line has
-// room for is cut to longest_dump_label characters. No bytes, no lines.
+// in hexadecimal, and as characters (a dot for spaces, control characters and everything from 0x7f
+// up). Each line begins with the label and a space unless the label is empty; a label is cut to
+// max_dump_label characters. Writes nothing if there are no bytes.
 void hex_dump(platform::byte_view bytes, std::string_view label = {});
 
-inline constexpr std::size_t longest_dump_label = 175;
+inline constexpr std::size_t max_dump_label = 175;
 
 }  // namespace nrx

@@ -5,9 +5,9 @@
 
 namespace nrx {
 
-// Switches the MCA on or off with a fixed sequence of commands and reports to the service "mca",
-// after a line on standard output that says so. The first that fails ends the sequence with its
-// code; it is reported twice, where it failed and here.
+// Prints a line on standard output, then switches the MCA on or off with a fixed sequence of
+// commands and reports to the service "mca". The first failure ends the sequence and is returned;
+// it is reported twice, by the call and here.
 platform::return_code switch_mca(bool on);
 
 }  // namespace nrx

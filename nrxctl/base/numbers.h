@@ -7,31 +7,47 @@
 
 namespace nrx {
 
-// Begins a hexadecimal number or service id.
+// The prefix of a hexadecimal number or service id.
 inline constexpr std::string_view hex_prefix = "0x";
 
-// Begins a decimal value in a payload, where hexadecimal is the default.
+// The prefix of a decimal value in a payload, where hexadecimal is the default.
 inline constexpr std::string_view decimal_prefix = "0d";
 
-// Whether every character is a decimal digit; so it is for no characters at all.
+// Returns true if every character is a decimal digit, also for an empty text.
 bool all_digits(std::string_view text);
 
-// The value of a run of digits in base 10 or 16, and of nothing but digits: no sign, no prefix, no
-// blanks. None if there are no digits or the value is beyond signed 64 bits.
+// Returns the value of a run of digits in base 10 or 16, without sign, prefix or spaces. Returns
+// nullopt if the run is empty, has any other character, or its value exceeds signed 64 bits.
 std::optional<std::int64_t> read_digits(std::string_view digits, int base);
 
-// The value of a command-line word: an optional sign, then "0x" and hexadecimal digits, or decimal
-// digits only. The digits must fit into signed 64 bits before the sign is applied. Anything else
-// ends the process with status 1 after "message (word)" as a line on standard output.
-std::int64_t parse_number(std::string_view word, std::string_view message);
+// A number as a user types it, taken apart.
+struct number_parts {
+    bool negative;
+    bool hexadecimal;
+    std::string_view digits;  // not checked
+};
 
-// The low 32 bits of such a number.
-inline std::uint32_t parse_low_32_bits(std::string_view word, std::string_view message) {
-    return static_cast<std::uint32_t>(parse_number(word, message));
+// Removes an optional sign and then an optional "0x".
+constexpr number_parts split_number(std::string_view argument) {
+    const bool negative = argument.starts_with('-');
+    if (negative || argument.starts_with('+')) argument.remove_prefix(1);
+    const bool hexadecimal = argument.starts_with(hex_prefix);
+    if (hexadecimal) argument.remove_prefix(hex_prefix.size());
+    return {negative, hexadecimal, argument};
 }
 
-// The number itself, refused likewise if it is negative or beyond the largest.
-std::uint32_t parse_number_up_to(std::uint32_t largest, std::string_view word,
+// Returns the value of an argument: an optional sign, then "0x" and hexadecimal digits, or decimal
+// digits. The digits must fit signed 64 bits before the sign is applied. Anything else ends the
+// process with status 1 after "message (argument)" as a line on standard output.
+std::int64_t parse_number(std::string_view argument, std::string_view message);
+
+// Returns the low 32 bits of such a number.
+inline std::uint32_t parse_low_32_bits(std::string_view argument, std::string_view message) {
+    return static_cast<std::uint32_t>(parse_number(argument, message));
+}
+
+// Returns the number itself. Rejects a negative one, and one greater than max, likewise.
+std::uint32_t parse_number_up_to(std::uint32_t max, std::string_view argument,
                                  std::string_view message);
 
 }  // namespace nrx

@@ -2,40 +2,150 @@
 
 #include <cerrno>
 #include <csignal>
-#include <cstddef>
 #include <poll.h>
-#include <string>
 #include <unistd.h>
+
+#include "nrxctl/base/text_line.h"
+#include "nrxctl/base/utf8.h"
 
 namespace nrx {
 
 namespace {
 
-// Whether a failed write is worth another try: after a signal, or once a full pipe has room again.
-bool may_try_again(int descriptor) {
-    if (errno == EINTR) return true;
-    if (errno != EAGAIN) return false;
-    pollfd waiting{descriptor, POLLOUT, 0};
-    return ::poll(&waiting, 1, -1) > 0 || errno == EINTR;
+constinit descriptor_sink standard_output(STDOUT_FILENO);
+constinit descriptor_sink standard_error(STDERR_FILENO);
+
+// The installed sinks.
+constinit line_sink* output_sink = &standard_output;
+constinit line_sink* error_sink = &standard_error;
+
+line_sink*& installed(standard_stream stream) {
+    return stream == standard_stream::output ? output_sink : error_sink;
 }
 
-// Whether all was written.
+// Returns true if a failed write should be retried: after a signal, or when a full pipe can take
+// more.
+bool can_retry(int descriptor) {
+    if (errno == EINTR) return true;
+    if (errno != EAGAIN) return false;
+    pollfd writable{descriptor, POLLOUT, 0};
+    return ::poll(&writable, 1, -1) > 0 || errno == EINTR;
+}
+
 bool write_all(int descriptor, std::string_view text) {
     while (!text.empty()) {
         const ssize_t written = ::write(descriptor, text.data(), text.size());
         if (written > 0) {
             text.remove_prefix(static_cast<std::size_t>(written));
-        } else if (written == 0 || !may_try_again(descriptor)) {
+        } else if (written == 0 || !can_retry(descriptor)) {
             return false;
         }
     }
     return true;
 }
 
+// Returns true for a character that a terminal may act upon: C0 controls but tab and line feed,
+// DEL, and C1 controls, which are c2 80 to c2 9f in UTF-8.
+bool is_control(std::string_view character) {
+    const auto first = static_cast<unsigned char>(character[0]);
+    if (character.size() == 1) {
+        return (first < 0x20 && first != '\t' && first != '\n') || first == 0x7f;
+    }
+    return first == 0xc2 && static_cast<unsigned char>(character[1]) < 0xa0;
+}
+
+// The size of the longest prefix that can be shown as it is.
+std::size_t printable_size(std::string_view text) {
+    std::size_t end = 0;
+    while (end < text.size()) {
+        const std::size_t size = utf8_character_size(text.substr(end));
+        if (size == 0 || is_control(text.substr(end, size))) break;
+        end += size;
+    }
+    return end;
+}
+
+std::string escape_controls(std::string_view text) {
+    text_line escaped;
+    while (!text.empty()) {
+        const std::size_t printable = printable_size(text);
+        escaped.text(text.substr(0, printable));
+        text.remove_prefix(printable);
+        if (text.empty()) break;
+        const std::size_t size = utf8_character_size(text) == 2 ? 2 : 1;
+        for (const char byte : text.substr(0, size))
+            escaped.text("\\x").zero_padded_hex(static_cast<unsigned char>(byte), 2);
+        text.remove_prefix(size);
+    }
+    return std::string(escaped.view());
+}
+
 }  // namespace
 
+bool descriptor_sink::write(std::string_view text) {
+    return note_result(write_all(descriptor_, text));
+}
+
+bool terminal_sink::write(std::string_view text) {
+    const bool printable = printable_size(text) == text.size();
+    return note_result(target_.write(printable ? text : escape_controls(text)));
+}
+
+block_sink::block_sink(line_sink& target) : target_(target) {
+    constexpr std::size_t block_size = 65'536;
+    buffer_.reserve(block_size);
+}
+
+block_sink::~block_sink() {
+    block_sink::flush();
+}
+
+bool block_sink::write(std::string_view text) {
+    if (text.size() > buffer_.capacity() - buffer_.size()) write_buffer();
+    if (text.size() > buffer_.capacity()) {
+        note_result(target_.write(text));
+    } else {
+        buffer_.append(text);
+    }
+    return !failed();
+}
+
+bool block_sink::flush() {
+    write_buffer();
+    note_result(target_.flush());
+    return !failed();
+}
+
+bool block_sink::write_buffer() {
+    const bool written = buffer_.empty() || target_.write(buffer_);
+    buffer_.clear();
+    return note_result(written);
+}
+
+scoped_sink::scoped_sink(standard_stream stream, line_sink& sink)
+    : stream_(stream), previous_(installed(stream)) {
+    installed(stream) = &sink;
+}
+
+scoped_sink::~scoped_sink() {
+    installed(stream_) = previous_;
+}
+
+block_output::block_output() : block_(*output_sink), installed_(standard_stream::output, block_) {
+}
+
+program_output::terminal_filter::terminal_filter(standard_stream stream)
+    : sink_(*installed(stream)), installed_(stream, sink_) {
+}
+
+program_output::program_output() {
+    std::signal(SIGPIPE, SIG_IGN);
+    if (::isatty(STDOUT_FILENO) != 0) output_.emplace(standard_stream::output);
+    if (::isatty(STDERR_FILENO) != 0) error_.emplace(standard_stream::error);
+}
+
 bool write_output(std::string_view text) {
-    return write_all(STDOUT_FILENO, text);
+    return output_sink->write(text);
 }
 
 void print_line(std::string_view text) {
@@ -46,11 +156,12 @@ void print_line(std::string_view text) {
 }
 
 void write_error(std::string_view text) {
-    write_all(STDERR_FILENO, text);
+    output_sink->flush();
+    error_sink->write(text);
 }
 
-void survive_closed_pipes() {
-    std::signal(SIGPIPE, SIG_IGN);
+void flush_output() {
+    output_sink->flush();
 }
 
 }  // namespace nrx

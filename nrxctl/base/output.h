@@ -1,26 +1,164 @@
-// Standard output and standard error, a whole line in one write.
+// Standard output and standard error.
 //
-// Output that cannot be written (a full disk, a closed pipe) is dropped; the tool goes on, because
-// what it does to the device must not depend on who reads along. What does nothing but write may
-// end there, and is told.
+// All text leaves through a line sink, one for each stream. By default a line is written to the
+// stream's descriptor as soon as it is complete, in one write; a program or a test can install
+// another sink for a scope. Output that cannot be written (a full disk, a closed pipe) is dropped
+// and the tool continues, because what it does to the device must not depend on who reads its
+// output.
+//
+// Sinks are installed and written by one thread.
 #pragma once
 
+#include <cstddef>
+#include <optional>
+#include <string>
 #include <string_view>
 
 namespace nrx {
 
-// Writes text, which brings its own line feeds, on standard output in one write. False if not all
-// of it could be written.
+// Where lines go.
+class line_sink {
+public:
+    constexpr line_sink() = default;
+    virtual ~line_sink() = default;
+    line_sink(const line_sink&) = delete;
+    line_sink& operator=(const line_sink&) = delete;
+
+    // Writes text, which consists of whole lines. Returns false if it could not be written.
+    virtual bool write(std::string_view text) = 0;
+
+    // Writes what the sink holds back. Returns false if it could not be written.
+    virtual bool flush() { return true; }
+
+    // Returns true if any text was lost so far.
+    [[nodiscard]] bool failed() const { return failed_; }
+
+protected:
+    // Remembers a failure. Returns written.
+    bool note_result(bool written) {
+        if (!written) failed_ = true;
+        return written;
+    }
+
+private:
+    bool failed_ = false;
+};
+
+// Writes to a file descriptor, which it does not own, one write per call.
+class descriptor_sink final : public line_sink {
+public:
+    constexpr explicit descriptor_sink(int descriptor) : descriptor_(descriptor) {}
+    bool write(std::string_view text) override;
+
+private:
+    int descriptor_;
+};
+
+// Makes text from a device safe for a terminal: writes control characters (but tab and line feed)
+// and bytes that are not UTF-8 as "\x1b". Everything else passes unchanged to the target.
+class terminal_sink final : public line_sink {
+public:
+    explicit terminal_sink(line_sink& target) : target_(target) {}
+    bool write(std::string_view text) override;
+    bool flush() override { return note_result(target_.flush()); }
+
+private:
+    line_sink& target_;
+};
+
+// Gathers lines in a buffer that is written to the target when it is full, when it is flushed, and
+// when the sink is destroyed. A failed write is reported by the call that causes it and by every
+// call after it.
+class block_sink final : public line_sink {
+public:
+    explicit block_sink(line_sink& target);
+    ~block_sink() override;
+    block_sink(const block_sink&) = delete;
+    block_sink& operator=(const block_sink&) = delete;
+
+    bool write(std::string_view text) override;
+    bool flush() override;
+
+private:
+    bool write_buffer();
+
+    line_sink& target_;
+    std::string buffer_;
+};
+
+// Keeps everything in memory.
+class memory_sink final : public line_sink {
+public:
+    bool write(std::string_view text) override {
+        text_.append(text);
+        return true;
+    }
+
+    // The text so far; valid until the next write.
+    [[nodiscard]] const std::string& text() const { return text_; }
+
+private:
+    std::string text_;
+};
+
+enum class standard_stream { output, error };
+
+// Installs a sink for a stream in place of the current one, which is reinstalled on destruction.
+// The sink must outlive this object.
+class scoped_sink {
+public:
+    scoped_sink(standard_stream stream, line_sink& sink);
+    ~scoped_sink();
+    scoped_sink(const scoped_sink&) = delete;
+    scoped_sink& operator=(const scoped_sink&) = delete;
+
+private:
+    standard_stream stream_;
+    line_sink* previous_;
+};
+
+// Writes standard output in blocks for a scope. For output that nobody follows live.
+class block_output {
+public:
+    block_output();
+
+private:
+    block_sink block_;
+    scoped_sink installed_;
+};
+
+// Prepares the streams of a program: text to a terminal passes a terminal_sink, and writing to a
+// pipe that nobody reads fails instead of ending the process. A program creates one first thing.
+class program_output {
+public:
+    program_output();
+
+private:
+    class terminal_filter {
+    public:
+        explicit terminal_filter(standard_stream stream);
+
+    private:
+        terminal_sink sink_;
+        scoped_sink installed_;
+    };
+
+    std::optional<terminal_filter> output_;
+    std::optional<terminal_filter> error_;
+};
+
+// Writes text, which brings its own line feeds, on standard output. Returns false if it could not
+// be written.
 bool write_output(std::string_view text);
 
-// Writes text and a line feed on standard output in one write.
+// Writes text and a line feed on standard output.
 void print_line(std::string_view text);
 
-// Writes text, which brings its own line feeds, on standard error in one write.
+// Writes text, which brings its own line feeds, on standard error, after all standard output so
+// far.
 void write_error(std::string_view text);
 
-// Lets a write into a pipe that nobody reads fail instead of ending the process. A program calls it
-// once, first.
-void survive_closed_pipes();
+// Writes standard output that is held back. Call it before waiting for anything.
+void flush_output();
 
 }  // namespace nrx

@@ -1,4 +1,4 @@
-// Payloads as users type them.
+// Payloads as users type them on the command line.
 #pragma once
 
 #include <cstdint>
@@ -7,13 +7,14 @@
 
 namespace nrx {
 
-// Packs words of a command line into payload, which is emptied first, as equally wide little-endian
-// values. "u8", "u16" or "u32" as the first word gives the width; without it values are one byte
-// wide. Values are hexadecimal, with or without "0x", or decimal after "0d".
+// Packs arguments into payload, which is cleared first, as little-endian values of equal width. The
+// first argument may give the width as "u8", "u16" or "u32"; otherwise values are one byte wide.
+// Values are hexadecimal, with or without "0x", or decimal after "0d".
 //
-// Words are taken from position on, which is left at the first word not taken: the end, or a word
-// that begins with "-". A word that is no number in signed 32 bits, or a value too large for the
-// width, ends the process with status 1 after a message on standard output.
-void parse_payload(std::span<char* const> words, int& position, std::vector<std::uint8_t>& payload);
+// Reads arguments from position on, up to the end or to one that begins with "-", and leaves
+// position there. A value that is no signed 32-bit number, or too large for the width, ends the
+// process with status 1 after a message on standard output.
+void parse_payload(std::span<char* const> arguments, int& position,
+                   std::vector<std::uint8_t>& payload);
 
 }  // namespace nrx

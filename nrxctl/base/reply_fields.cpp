@@ -2,13 +2,13 @@
 
 #include <string>
 
-#include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/check.h"
 
 namespace nrx {
 
-bool check_length(platform::byte_view bytes, std::size_t needed, source_place place) {
-    if (bytes.size() >= needed) return true;
-    return check(false, ("length >= " + std::to_string(needed)).c_str(), place);
+bool check_length(platform::byte_view bytes, std::size_t required, source_location location) {
+    if (bytes.size() >= required) return true;
+    return check(false, ("length >= " + std::to_string(required)).c_str(), location);
 }
 
 }  // namespace nrx

@@ -1,14 +1,14 @@
 #include "nrxctl/base/service_conn.h"
 
-#include "nrxctl/base/failure_report.h"
-#include "nrxctl/base/matching.h"
-#include "nrxctl/base/open_connection.h"
+#include "nrxctl/base/channel.h"
+#include "nrxctl/base/check.h"
+#include "nrxctl/base/services.h"
 
 namespace nrx {
 
-bool service_conn::open(expected_failure missing) {
+bool service_conn::open(on_failure on_missing) {
     service_ = platform::first_match(match_name(name_));
-    if (!service_ && missing == expected_failure::is_silent) return false;
+    if (!service_ && on_missing == on_failure::ignore) return false;
     if (!check(service_, "service")) return false;
     child_ = platform::first_child(service_, platform::service_plane);
     if (!check(child_, "child")) return false;

@@ -10,9 +10,9 @@
 
 namespace nrx {
 
-// Owns the service, its first child and the connection that is opened on the child. What was found
-// stays in the object, after a failed open too; destruction closes the connection, then releases
-// the child, then the service.
+// Owns a service, its first child and a connection that is opened on the child. What open() found
+// stays in the object, even if it failed. Destruction closes the connection, then releases the
+// child, then the service.
 class service_conn {
 public:
     explicit service_conn(std::string name) : name_(std::move(name)) {}
@@ -22,16 +22,16 @@ public:
     service_conn(service_conn&&) = delete;
     service_conn& operator=(service_conn&&) = delete;
 
-    // Finds the service by its bare registry name, of whatever class, takes its first child and
-    // opens a connection of type 0 on that. Whether the connection is open; if not, the check that
-    // failed is reported, but for a missing service if that is to be silent.
-    bool open(expected_failure missing = expected_failure::is_reported);
+    // Finds the service by its registry name, whatever its class, and opens a connection of type 0
+    // on its first child. Returns true on success; otherwise the failed check is reported, except
+    // that a missing service is reported or not as on_missing says.
+    bool open(on_failure on_missing = on_failure::report);
 
-    // The connection; none before a successful open.
+    // The connection; empty before a successful open.
     [[nodiscard]] const platform::connection& connection() const { return connection_; }
 
 protected:
-    // Members are given back from the last to the first.
+    // Members are released from the last to the first.
     std::string name_;
     platform::service service_;
     platform::service child_;

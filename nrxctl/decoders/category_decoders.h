@@ -1,4 +1,4 @@
-// The decoders of categories whose records differ in their names alone.
+// The decoders, by the category of a record.
 #pragma once
 
 #include <cstdint>
@@ -7,50 +7,11 @@
 
 namespace nrx {
 
-// Events are named by component.
-class execution_decoder : public profile_decoder {
-public:
-    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] short_text event_name(std::uint32_t component,
-                                        std::uint32_t event) const override;
-};
+// Returns the decoder of a category, or null if the category has none. It lives as long as the
+// process.
+const profile_decoder* decoder_for_category(std::uint32_t category);
 
-class trace_decoder : public profile_decoder {
-public:
-    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
-};
-
-class sensor_decoder : public profile_decoder {
-public:
-    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] short_text event_name(std::uint32_t component,
-                                        std::uint32_t event) const override;
-};
-
-class orrin_decoder : public profile_decoder {
-public:
-    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] short_text event_name(std::uint32_t component,
-                                        std::uint32_t event) const override;
-};
-
-class interrupt_decoder : public profile_decoder {
-public:
-    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] short_text event_name(std::uint32_t component,
-                                        std::uint32_t event) const override;
-};
-
-class uart_decoder : public profile_decoder {
-public:
-    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
-    [[nodiscard]] short_text event_name(std::uint32_t component,
-                                        std::uint32_t event) const override;
-};
-
-class scm_decoder : public profile_decoder {
-public:
-    [[nodiscard]] short_text component_name(std::uint32_t component) const override;
-};
+// Returns the decoder of categories that have none of their own.
+const profile_decoder& default_decoder();
 
 }  // namespace nrx

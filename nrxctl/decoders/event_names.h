@@ -1,11 +1,10 @@
-// What the identifier bytes of an event record are called.
-//
-// An identifier that is missing here has no name; it is shown as its number.
+// The names of the identifier bytes of an event record. An identifier that is not listed is shown
+// as its number.
 #pragma once
 
 #include <array>
 
-#include "nrxctl/decoders/id_names.h"
+#include "nrxctl/decoders/short_text.h"
 
 namespace nrx {
 
@@ -76,10 +75,6 @@ inline constexpr std::array command_events{
     id_name{6, "hist-report"}, id_name{7, "user-report"},
 };
 inline constexpr std::array extfunction_events{id_name{0, "extfunction"}};
-inline constexpr std::array execution_events{
-    name_table(scheduler_events), name_table(function_events),    name_table(workloop_events),
-    name_table(command_events),   name_table(extfunction_events),
-};
 inline constexpr std::array sensor_events{
     id_name{0, "latency"},          id_name{1, "rawdata"},     id_name{2, "data"},
     id_name{3, "filtdata"},         id_name{4, "apdata"},      id_name{5, "regwrite"},
@@ -105,19 +100,30 @@ inline constexpr std::array wake_events{
     id_name{2, "wake-event-info"},
 };
 
-// Every table, by what it names.
+// The event tables of the category "exec", by component.
+inline constexpr std::array execution_events{
+    basic_name_row<id_name_table>{0, scheduler_events},
+    basic_name_row<id_name_table>{1, function_events},
+    basic_name_row<id_name_table>{2, workloop_events},
+    basic_name_row<id_name_table>{3, command_events},
+    basic_name_row<id_name_table>{4, extfunction_events},
+};
+
+// All tables; the bound of a record's text is computed from them.
 inline constexpr std::array component_tables{
-    name_table(execution_components), name_table(trace_components),
-    name_table(sensor_components),    name_table(orrin_components),
-    name_table(talvor_components),    name_table(interrupt_components),
-    name_table(uart_components),      name_table(scm_components),
-    name_table(wake_components),
+    id_name_table(execution_components), id_name_table(trace_components),
+    id_name_table(sensor_components),    id_name_table(orrin_components),
+    id_name_table(talvor_components),    id_name_table(interrupt_components),
+    id_name_table(uart_components),      id_name_table(scm_components),
+    id_name_table(wake_components),
 };
 inline constexpr std::array event_tables{
-    name_table(scheduler_events), name_table(function_events),    name_table(workloop_events),
-    name_table(command_events),   name_table(extfunction_events), name_table(sensor_events),
-    name_table(orrin_events),     name_table(talvor_events),      name_table(interrupt_events),
-    name_table(uart_events),      name_table(wake_events),
+    id_name_table(scheduler_events),   id_name_table(function_events),
+    id_name_table(workloop_events),    id_name_table(command_events),
+    id_name_table(extfunction_events), id_name_table(sensor_events),
+    id_name_table(orrin_events),       id_name_table(talvor_events),
+    id_name_table(interrupt_events),   id_name_table(uart_events),
+    id_name_table(wake_events),
 };
 
 }  // namespace nrx

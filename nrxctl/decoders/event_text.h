@@ -5,34 +5,40 @@
 #include <cstddef>
 #include <string_view>
 
-#include "nrxctl/decoders/line_bound.h"
-#include "nrxctl/decoders/put_text.h"
+#include "nrxctl/base/failure_report.h"
 
 namespace nrx {
 
-// Holds its room in itself, enough for the longest text of a record and a line feed, so that
-// nothing is allocated. What is appended when there is no room is left out.
+// Stops the process with a report on standard error, as a failed assert does, in every build.
+[[noreturn]] void assertion_failed(std::string_view function, std::string_view expression,
+                                   source_location location = source_location::current());
+
+// A buffer of fixed size, so that nothing is allocated.
 class event_text {
 public:
+    // Large enough for the text of any record and a line feed.
+    static constexpr std::size_t capacity = 1024;
+
+    // A writer may overwrite this many characters after its text.
+    static constexpr std::size_t slack = 32;
+
     // Removes everything.
     void clear() { size_ = 0; }
 
     // The text so far; valid until the next change.
-    [[nodiscard]] std::string_view view() const { return {room_.data(), size_}; }
+    [[nodiscard]] std::string_view view() const { return {buffer_.data(), size_}; }
 
-    // Appends up to longest characters, which write puts at the place that it is given; it returns
-    // where they end.
+    // Appends the text that write(target) writes at target. It writes at most max_size characters
+    // and returns their end. Stops the process if max_size characters do not fit.
     template <class Write>
-    void append(std::size_t longest, Write write) {
-        if (longest > capacity - size_) return;
-        size_ = static_cast<std::size_t>(write(room_.data() + size_) - room_.data());
+    void append(std::size_t max_size, Write write) {
+        if (max_size > capacity - size_) assertion_failed("append", "max_size <= capacity - size_");
+        size_ = static_cast<std::size_t>(write(buffer_.data() + size_) - buffer_.data());
     }
 
 private:
-    static constexpr std::size_t capacity = longest_record_text + 1;
-
     std::size_t size_ = 0;
-    std::array<char, capacity + put_slack> room_;  // only what was written is ever read
+    std::array<char, capacity + slack> buffer_;  // only what was written is ever read
 };
 
 }  // namespace nrx

@@ -1,20 +1,25 @@
 #include "nrxctl/decoders/profile_decoder.h"
 
-#include "nrxctl/decoders/boot_time.h"
-#include "nrxctl/decoders/calendar_time.h"
 #include "nrxctl/decoders/event_names.h"
-#include "nrxctl/decoders/id_names.h"
 #include "nrxctl/decoders/record_fields.h"
 #include "nrxctl/decoders/record_layout.h"
+#include "nrxctl/decoders/record_times.h"
+#include "nrxctl/decoders/write_text.h"
 
 namespace nrx {
 
 namespace {
 
-char* put_name(char* to, const name_field& field, const short_text& name) {
-    to = put_quoted(put(to, field.key.text), name, field.width);
-    *to++ = ',';
-    return to;
+static_assert(max_record_text + 1 <= event_text::capacity);
+static_assert(write_slack <= event_text::slack);
+
+constexpr id_name_table categories(category_names);
+constexpr id_name_table types(type_names);
+
+char* write_name(char* target, const name_field& field, const short_text& name) {
+    target = write_quoted(write_text(target, field.key.text), name, field.width);
+    *target++ = ',';
+    return target;
 }
 
 }  // namespace
@@ -23,36 +28,36 @@ void profile_decoder::print_record(const profile_record& record, event_text& lin
     const short_text category = category_name(record.category());
     const short_text component = component_name(record.component());
     const short_text event = event_name(record.component(), record.event());
-    const short_text type = name_for_id(type_names, record.type());
+    const short_text type = name_for_id(types, record.type());
     const auto calendar = calendar_time(record.timestamp());
-    const auto booted = boot_time_usec();
-    line.append(longest_names, [&](char* to) {
-        to = put_name(put(to, short_text("{ ")), category_field, category);
-        to = put_name(to, component_field, component);
-        to = put_name(to, event_field, event);
-        return put_name(to, type_field, type);
+    const auto boot_time = boot_time_usec();
+    line.append(max_names_text, [&](char* target) {
+        target = write_name(write_text(target, short_text("{ ")), category_field, category);
+        target = write_name(target, component_field, component);
+        target = write_name(target, event_field, event);
+        return write_name(target, type_field, type);
     });
     append_fields(line, record, header_rows);
     decode_body(line, record);
     append_fields(line, record, id_rows);
-    line.append(longest_end, [&](char* to) {
-        to = put_list(put(to, binary_data_key.text), record.bytes, 0);
+    line.append(max_end_text, [&](char* target) {
+        target = write_list(write_text(target, binary_data_key.text), record.bytes, 0);
         if (calendar) {
-            *to++ = ',';
-            to = put_quoted(put(to, calendar_time_key.text), *calendar, 0);
+            *target++ = ',';
+            target = write_quoted(write_text(target, calendar_time_key.text), *calendar, 0);
         }
-        if (booted) {
-            *to++ = ',';
-            to = put(to, boot_timestamp_key.text);
-            to = put_number(to, static_cast<std::uint64_t>(*booted), 0);
+        if (boot_time) {
+            *target++ = ',';
+            target = write_text(target, boot_timestamp_key.text);
+            target = write_number(target, static_cast<std::uint64_t>(*boot_time), 0);
         }
-        *to++ = '}';
-        return to;
+        *target++ = '}';
+        return target;
     });
 }
 
 short_text profile_decoder::category_name(std::uint32_t category) const {
-    return name_for_id(category_names, category);
+    return name_for_id(categories, category);
 }
 
 short_text profile_decoder::component_name(std::uint32_t component) const {

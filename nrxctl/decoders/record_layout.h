@@ -1,21 +1,24 @@
-// What the text of a record is made of: its rows, in the order in which they are written.
+// The parts of a record's text, in the order in which they are written, and its maximum length.
 //
-// Offsets count from the start of the record, as the coprocessor's profiler writes it.
+// Offsets count from the start of the record.
 #pragma once
 
+#include <algorithm>
 #include <array>
+#include <cstddef>
 #include <cstdint>
+#include <span>
 
-#include "nrxctl/decoders/field_key.h"
-#include "nrxctl/decoders/record_row.h"
+#include "nrxctl/decoders/event_names.h"
+#include "nrxctl/decoders/record_fields.h"
 
 namespace nrx {
 
-// A name in single quotes, and how wide it is at least.
+// A name in single quotes, and its minimum width.
 struct name_field {
     consteval name_field(field_key name_key, std::uint8_t name_width)
         : key(name_key), width(name_width) {
-        if (name_width > widest_padding) throw "the field is too wide";
+        if (name_width > max_padding) throw "the field is too wide";
     }
 
     field_key key;
@@ -32,7 +35,7 @@ inline constexpr std::array header_rows{
     rows::u32("sequence_num", 4),
 };
 
-// Behind the body.
+// After the body.
 inline constexpr std::array id_rows{
     rows::u8("type-id", 0, 0),
     rows::u8("category-id", 3, 0),
@@ -43,7 +46,7 @@ inline constexpr field_key binary_data_key{"binary-data"};
 inline constexpr field_key calendar_time_key{"calendar-time"};
 inline constexpr field_key boot_timestamp_key{"boot-timestamp"};
 
-// Bodies, by the record's type.
+// Bodies of the types.
 
 inline constexpr std::array long_data_rows{
     rows::u16("subtype", 16),
@@ -97,7 +100,7 @@ inline constexpr std::array decimation_info_rows{
     rows::u64("next-dispatch", 16),
 };
 
-// A type beyond the table has no body.
+// By type. A type beyond the table has no body.
 inline constexpr std::array body_by_type{
     record_rows(),                        // stop
     record_rows(long_data_rows),          //
@@ -114,17 +117,17 @@ inline constexpr std::array body_by_type{
     record_rows(decimation_info_rows),    //
 };
 
-// Bodies of single records of two categories, which their decoders tell by the first word.
+// Bodies that two categories have for single records, which they recognize by the first word.
 
 inline constexpr std::array talvor_data_in_rows{
-    rows::u32("arg1", 16),      rows::u32("arg2", 20),      rows::u32("arg3", 24),
-    rows::u32("arg4", 28),      rows::u32("arg5", 32),      rows::u32("arg6", 36),
-    rows::fraction_16("x", 16), rows::fraction_16("y", 20), rows::fraction_16("z", 24),
+    rows::u32("arg1", 16), rows::u32("arg2", 20), rows::u32("arg3", 24),
+    rows::u32("arg4", 28), rows::u32("arg5", 32), rows::u32("arg6", 36),
+    rows::q16_16("x", 16), rows::q16_16("y", 20), rows::q16_16("z", 24),
 };
 inline constexpr std::array talvor_data_out_rows{
-    rows::u32("arg1", 16),      rows::u32("arg2", 20),      rows::u32("arg3", 24),
-    rows::u32("arg4", 28),      rows::u32("arg5", 32),      rows::u32("arg6", 36),
-    rows::fraction_12("x", 16), rows::fraction_12("y", 20), rows::fraction_12("z", 24),
+    rows::u32("arg1", 16), rows::u32("arg2", 20), rows::u32("arg3", 24),
+    rows::u32("arg4", 28), rows::u32("arg5", 32), rows::u32("arg6", 36),
+    rows::q20_12("x", 16), rows::q20_12("y", 20), rows::q20_12("z", 24),
 };
 inline constexpr std::array wake_request_rows{
     rows::u32("wake_reason", 16),
@@ -140,5 +143,45 @@ inline constexpr std::array special_bodies{
     record_rows(wake_request_rows),
     record_rows(wake_event_rows),
 };
+
+// Bounds, in characters.
+
+// A name is in one of the tables or has the digits of its identifier.
+consteval std::size_t max_name_text(name_field field, std::span<const id_name_table> tables) {
+    std::size_t max_name = max_u8_digits;
+    for (const id_name_table& table : tables) {
+        for (const id_name& row : table.rows())
+            max_name = std::max(max_name, row.name.size());
+    }
+    return field.key.text.size() + std::max<std::size_t>(field.width, max_name + quotes) + 1;
+}
+
+// "{ " and the four names.
+inline constexpr std::size_t max_names_text = [] {
+    constexpr std::array categories{id_name_table(category_names)};
+    constexpr std::array types{id_name_table(type_names)};
+    return 2 + max_name_text(category_field, categories) +
+           max_name_text(component_field, component_tables) +
+           max_name_text(event_field, event_tables) + max_name_text(type_field, types);
+}();
+
+inline constexpr std::size_t max_body_text = [] {
+    std::size_t max_text = 0;
+    for (const record_rows& body : body_by_type)
+        max_text = std::max(max_text, body.max_text);
+    for (const record_rows& body : special_bodies)
+        max_text = std::max(max_text, body.max_text);
+    return max_text;
+}();
+
+// The bytes, both times and "}".
+inline constexpr std::size_t max_end_text =
+    binary_data_key.text.size() + max_list_size(profile_record_size) + 1 +
+    calendar_time_key.text.size() + quotes + short_text::capacity + 1 +
+    boot_timestamp_key.text.size() + max_u64_digits + 1;
+
+inline constexpr std::size_t max_record_text = max_names_text + record_rows(header_rows).max_text +
+                                               max_body_text + record_rows(id_rows).max_text +
+                                               max_end_text;
 
 }  // namespace nrx

@@ -6,7 +6,8 @@
 
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/text_line.h"
-#include "nrxctl/decoders/profile_hexdump.h"
+#include "nrxctl/decoders/event_names.h"
+#include "nrxctl/decoders/record_text.h"
 
 namespace nrx {
 
@@ -16,13 +17,13 @@ constexpr std::uint8_t long_data_type = 1;
 constexpr std::uint8_t event_type = 3;
 constexpr std::uint8_t scm_category = 9;
 
-// By component.
-constexpr std::array<std::string_view, 6> bus_names{"spi0",  "smb0",      "smb1",
-                                                    "i2cm0", "i2c_ctrl0", "i2c_ctrl1"};
-// By the first word of the body.
-constexpr std::array<std::string_view, 2> direction_names{"scm_read", "scm_write"};
+constexpr id_name_table buses(scm_components);
 
-constexpr record_extent data_place{24, 24};
+// By the first word of the body.
+constexpr std::array direction_rows{name_row{0, "scm_read"}, name_row{1, "scm_write"}};
+constexpr name_table directions(direction_rows);
+
+constexpr record_extent data_extent{24, 24};
 
 }  // namespace
 
@@ -42,19 +43,20 @@ void scm_packet_printer::print_data(const profile_record& record) const {
     text_line label;
     label.text(label_).text(":   data[").number(offset).text("-").number(length - 1);
     label.text("/").number(packet_size).text("]: ");
-    const auto data = record.run(data_place);
+    const auto data = record.run(data_extent);
     nrx_profile_hexdump(label.view(), data.first(std::min<std::size_t>(length, data.size())), 1);
 }
 
 void scm_packet_printer::print_transfer(const profile_record& record) {
-    const std::uint32_t direction = record.u32(16);
-    if (record.component() >= bus_names.size() || direction >= direction_names.size()) return;
+    const short_text* bus = buses.find(record.component());
+    const std::string_view* direction = directions.find(record.u32(16));
+    if (bus == nullptr || direction == nullptr) return;
     last_transfer_ = record.timestamp();
-    label_.assign(bus_names[record.component()]).append(".");
+    label_.assign(bus->view()).append(".");
     label_.append(std::to_string(record.event()));
     const auto bus_time = static_cast<std::int64_t>(record.u64(20));
     text_line line;
-    line.text(label_).text(": ").text(direction_names[direction]).text(" wqr_timestamp=");
+    line.text(label_).text(": ").text(*direction).text(" wqr_timestamp=");
     line.number(static_cast<std::int64_t>(last_transfer_)).text(" scm_timestamp=").number(bus_time);
     print_line(line.view());
 }

@@ -1,4 +1,4 @@
-// The transfers of the coprocessor's buses, and the data that belongs to them.
+// The transfers on the coprocessor's buses, and their data.
 #pragma once
 
 #include <cstdint>
@@ -12,16 +12,16 @@ namespace nrx {
 class scm_packet_printer {
 public:
     // Prints a line on standard output for a transfer on a known bus in a known direction, and for
-    // each data record that has the time stamp of the last transfer printed (0 before the first)
-    // and is not empty; nothing for any other record.
+    // each data record that is not empty and has the timestamp of the last transfer printed (0
+    // before the first). Prints nothing for any other record.
     void print(const profile_record& record);
 
 private:
     void print_transfer(const profile_record& record);
     void print_data(const profile_record& record) const;
 
-    std::string label_;                // of the last transfer: bus name, point, event
-    std::uint64_t last_transfer_ = 0;  // its time stamp
+    std::string label_;                // of the last transfer: bus name, dot, event
+    std::uint64_t last_transfer_ = 0;  // its timestamp
 };
 
 // Prints a record with one scm_packet_printer, which lives as long as the process. A

@@ -5,11 +5,9 @@
 #include <cstdint>
 
 #include "nrxctl/base/command_channel.h"
-#include "nrxctl/base/field_text.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
-#include "nrxctl/base/whole_records.h"
 
 namespace nrx {
 
@@ -17,9 +15,9 @@ namespace {
 
 constexpr std::uint32_t client_command = 0x39;
 constexpr std::size_t entry_size = 31;
-constexpr std::size_t most_entries = 16;
+constexpr std::size_t max_entries = 16;
 
-constexpr std::size_t longest_name = 12;
+constexpr std::size_t name_size = 12;
 constexpr std::size_t interval_offset = 12;
 constexpr std::size_t batch_offset = 16;
 constexpr std::size_t threshold_offset = 20;
@@ -34,7 +32,7 @@ constexpr std::string_view heading =
 void print_client(std::string_view label, platform::byte_view entry) {
     const reply_fields fields(entry);
     text_line line;
-    line.text(label).left(text_before_nul(entry.first(longest_name)), 32).text(": ");
+    line.text(label).pad_right(text_before_nul(entry.first(name_size)), 32).text(": ");
     line.number(fields.s32(interval_offset), 8).text(" ");
     line.number(fields.s32(batch_offset), 8).text(" ");
     line.number(fields.s32(threshold_offset), 9).text(" ");
@@ -46,10 +44,9 @@ void print_client(std::string_view label, platform::byte_view entry) {
 }  // namespace
 
 void print_client_table(std::string_view label, std::string_view service_name) {
-    std::array<std::uint8_t, most_entries * entry_size> room{};
-    platform::byte_span entries = room;
-    const auto kr =
-        send_command(service_name, client_command, {}, entries, expected_failure::is_silent);
+    std::array<std::uint8_t, max_entries * entry_size> buffer{};
+    platform::byte_span entries = buffer;
+    const auto kr = send_command(service_name, client_command, {}, entries, on_failure::ignore);
     if (kr == platform::success) print_clients(label, entries);
 }
 

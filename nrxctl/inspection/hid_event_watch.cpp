@@ -1,6 +1,7 @@
 #include "nrxctl/inspection/hid_event_watch.h"
 
-#include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/check.h"
+#include "nrxctl/base/output.h"
 #include "nrxctl/inspection/hid_events.h"
 #include "nrxctl/inspection/hid_statistics.h"
 #include "platform/hid_event_client.h"
@@ -13,15 +14,16 @@ platform::return_code watch_hid_events(std::optional<std::chrono::seconds> durat
     if (!check(client, "client")) return platform::not_found;
     platform::return_code kr = platform::set_event_callback(
         client, [](const platform::hid_event& event) { print_hid_event(event, {}); });
-    if (!check_success(kr, "kr == 0 ")) return kr;
+    if (!check_success(kr, condition::kr_is_zero)) return kr;
     kr = platform::set_reset_callback(client, [&] { reset_callback(client, nullptr); });
-    if (!check_success(kr, "kr == 0 ")) return kr;
+    if (!check_success(kr, condition::kr_is_zero)) return kr;
     kr = platform::set_statistics_callback(client, stats_callback);
-    if (!check_success(kr, "kr == 0 ")) return kr;
+    if (!check_success(kr, condition::kr_is_zero)) return kr;
     kr = platform::schedule_on_loop(client);
-    if (!check_success(kr, "kr == 0 ")) return kr;
+    if (!check_success(kr, condition::kr_is_zero)) return kr;
+    flush_output();
     kr = duration ? platform::run_loop_for(*duration) : platform::run_loop();
-    check_success(kr, "kr == 0 ");
+    check_success(kr, condition::kr_is_zero);
     return kr;
 }
 

@@ -1,7 +1,7 @@
-// HID events and resets of the event system as text, a line each on standard output.
+// HID events and resets of the event system as text, one line each on standard output.
 //
-// The printers share a stream with stats_callback, whose format an accelerometer and a
-// vendor-defined event switch for good: to fixed notation with six digits, and left alignment.
+// Accelerometer and vendor-defined events set the number format for all that is printed after them,
+// updates that stats_callback prints included: fixed notation, six digits, left-aligned.
 #pragma once
 
 #include <string_view>
@@ -11,10 +11,12 @@
 
 namespace nrx {
 
-// Prints an event: its time since the first and since the previous one and its latency, all in
-// seconds; the fields of an accelerometer event. Of a vendor-defined event the line has the present
-// time, the event's time on both clocks, its data as text up to the first NUL, the label, and a
-// marker unless it came about half a second after the previous one.
+// Prints an event. Times are in seconds.
+//
+// Null and accelerometer events: the time since the first and since the previous event, the
+// latency, and the fields of the acceleration. Vendor-defined events: the current time, the time of
+// the event on both clocks, its data as text up to the first NUL, the label, and a marker unless
+// the previous one occurred about half a second before. Other events: the type and the latency.
 void print_hid_event(const platform::hid_event& event, std::string_view label);
 
 // Prints that the event system was reset, with the client, the context and the client's list of

@@ -1,15 +1,15 @@
-// Aggregate-statistics updates of the firmware as text.
+// Updates of the firmware's aggregate statistics as text.
 #pragma once
 
 #include "platform/bytes.h"
 
 namespace nrx {
 
-// Prints a line on standard output for each whole record: what is done to which counter, and the
-// value. A trailing part is ignored. A record (from a statistics update) is 7 bytes, little-endian:
+// Prints a line on standard output for each complete record of a statistics update: the operation,
+// the counter and the value. Trailing bytes are ignored. A record has 7 bytes, little-endian:
 //    1  u8   operation      2  u8   key index      3  s32  value
-// The value is an integer or has 16 fraction bits, as the operation tells. Numbers are in the
-// format that the printers of hid_events.h have left.
+// The operation determines whether the value is an integer or in q16.16 format. The number format
+// is the one that the printers in hid_events.h have set.
 void stats_callback(platform::byte_view records);
 
 }  // namespace nrx

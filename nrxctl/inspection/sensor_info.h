@@ -6,10 +6,10 @@
 
 namespace nrx {
 
-// Prints a labelled summary of a sensor service ("accel", "gyro", "compass" or any other); at
-// detail level 2 also its clients, extra information, registers, performance counters and event
-// statistics. A service that does not tell its sample interval has no summary: a line says so, and
-// if there is no such service, the list of those that there are follows.
+// Prints the properties of a sensor service, a labelled line each, and the lines that only "accel",
+// "gyro" and "compass" have; at detail level 2 also its clients, the reports of its firmware and
+// its event statistics. If the sample interval cannot be read, prints a line that says so instead,
+// and, if there is no such service, the HID services that there are.
 void print_sensor_info(std::string_view service_name, std::int32_t level);
 
 }  // namespace nrx

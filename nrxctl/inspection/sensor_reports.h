@@ -1,4 +1,4 @@
-// The property reports of a sensor service: small ones, and all optional but the first.
+// The property reports of a sensor service. They are small, and all but the first are optional.
 #pragma once
 
 #include <array>
@@ -8,27 +8,27 @@
 #include <utility>
 #include <vector>
 
+#include "nrxctl/base/identifiers.h"
 #include "nrxctl/base/reply_fields.h"
 #include "platform/bytes.h"
 #include "platform/return_code.h"
 
 namespace nrx {
 
-// Whether a reply that leaves room unused lacks something (numbers), or is what it is (texts,
-// lists).
-enum class reply_extent { fixed, variable };
+// Whether a reply must fill its buffer (numbers), or may be shorter (texts, lists).
+enum class reply_length { fixed, variable };
 
 struct sensor_report {
-    std::uint32_t id;
-    std::size_t size;                // the room for the reply, in bytes
-    std::int32_t failure_value = 0;  // each number of a report that was not read
-    reply_extent extent = reply_extent::fixed;
+    report_id id;
+    std::size_t capacity;            // of the buffer for the reply, in bytes
+    std::int32_t failure_value = 0;  // stands in for each number if the report cannot be read
+    reply_length length = reply_length::fixed;
 };
 
-// What a sensor answered to the request for a report; nothing read, at first.
+// The reply of a sensor to the request for a report.
 class sensor_reply {
 public:
-    // A reply that was not read has no bytes.
+    // A reply that has not been read: it has no bytes.
     sensor_reply() = default;
     sensor_reply(platform::return_code result, std::vector<std::uint8_t> bytes,
                  std::int32_t failure_value)
@@ -38,8 +38,8 @@ public:
     [[nodiscard]] bool was_read() const { return result_ == platform::success; }
     [[nodiscard]] platform::byte_view bytes() const { return bytes_; }
 
-    // The little-endian number at an offset: the failure value if the report was not read, 0 if the
-    // number is not wholly inside the reply.
+    // Returns the little-endian number at an offset: the failure value if the report was not read,
+    // 0 if the number is not wholly inside the reply.
     template <class Number>
     [[nodiscard]] Number number(std::size_t offset = 0) const {
         return was_read() ? reply_fields(bytes_).number<Number>(offset)
@@ -50,10 +50,8 @@ public:
     }
     [[nodiscard]] bool is_set() const { return s32() != 0; }
 
-    // How many whole 32-bit numbers the reply holds.
-    [[nodiscard]] std::size_t count_of_words() const {
-        return bytes_.size() / sizeof(std::uint32_t);
-    }
+    // The number of complete 32-bit numbers in the reply.
+    [[nodiscard]] std::size_t number_count() const { return bytes_.size() / sizeof(std::uint32_t); }
 
 private:
     platform::return_code result_ = platform::not_found;
@@ -61,11 +59,11 @@ private:
     std::int32_t failure_value_ = 0;
 };
 
-// Reads a report. That the service is missing or does not answer is not reported; that it cannot be
-// opened is, and a reply too short for a report of a fixed size.
+// Reads a report. A service that is missing or does not reply is not reported; one that cannot be
+// opened is, and so is a reply too short for a report of fixed length.
 sensor_reply read_sensor_report(std::string_view service_name, const sensor_report& report);
 
-// What every sensor may tell about itself, in the order in which it is asked.
+// The properties of a sensor, in the order in which they are read.
 enum class sensor_property {
     sample_interval,       // u32, microseconds; all bits set: unsupported
     hardware_interval,     // s32
@@ -78,7 +76,7 @@ enum class sensor_property {
     factory_mode,          // u32, a flag
     vendor,                // text
     model,                 // text
-    calibration_matrix,    // nine s32 with 16 fraction bits, row by row
+    calibration_matrix,    // nine q16.16 numbers, row by row
     calibration_offset,    // three s32
     orientation,           // nine s8, row by row
     sample_intervals,      // those supported: u32, microseconds each
@@ -93,12 +91,12 @@ inline constexpr std::size_t sensor_property_count =
 
 class sensor_properties {
 public:
-    // Asks a sensor for its properties, one after the other; for none but the sample interval if
-    // that cannot be read, with its code as the result.
+    // Reads all properties of a sensor. If the sample interval cannot be read, stops there and
+    // fails with the platform's code.
     platform::return_code read(std::string_view service_name);
 
-    [[nodiscard]] const sensor_reply& operator[](sensor_property which) const {
-        return replies_[static_cast<std::size_t>(which)];
+    [[nodiscard]] const sensor_reply& operator[](sensor_property property) const {
+        return replies_[static_cast<std::size_t>(property)];
     }
 
 private:

@@ -9,7 +9,6 @@
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
-#include "nrxctl/base/whole_records.h"
 #include "nrxctl/printers/field_table.h"
 
 namespace nrx {
@@ -28,7 +27,7 @@ constexpr std::array scan_state_rows{
     field_row{""},
     field_row{"waitNumFramesAfterSuccess", u32, 8},
     field_row{"motionTriggerNumFrames", u32, 4},
-    field_row{"accelVarThreshold", fixed16_single, 0},
+    field_row{"accelVarThreshold", q16_16, 0},
     field_row{""},
 };
 constexpr field_table scan_state{
@@ -61,7 +60,7 @@ void print_link_counters(platform::byte_view report) {
     print_fields(link_counters, report);
 }
 
-// Records of 12 bytes: a timestamp (u64) and a data value (u32). A trailing part is no record.
+// Records of 12 bytes: a timestamp (u64) and a data value (u32).
 void print_data_log(platform::byte_view report) {
     constexpr std::size_t record_size = 12;
     text_line line;
@@ -73,10 +72,10 @@ void print_data_log(platform::byte_view report) {
     });
 }
 
-// Which layout a service's reports have.
+// The layout of a service's reports.
 struct service_layout {
     std::string_view service_name;
-    std::optional<std::int32_t> only_report;  // none: every report
+    std::optional<report_id> only_report;  // nullopt: every report
     void (*print)(platform::byte_view report);
 };
 
@@ -88,13 +87,12 @@ constexpr std::array layouts{
 
 }  // namespace
 
-void print_diag_report(std::string_view service_name, std::int32_t report_id,
-                       platform::byte_view report) {
+void print_diag_report(std::string_view service_name, report_id id, platform::byte_view report) {
     if (report.empty()) return;
     const auto* layout =
         std::find_if(layouts.begin(), layouts.end(), [&](const service_layout& candidate) {
             return candidate.service_name == service_name &&
-                   candidate.only_report.value_or(report_id) == report_id;
+                   candidate.only_report.value_or(id) == id;
         });
     layout == layouts.end() ? hex_dump(report) : layout->print(report);
 }

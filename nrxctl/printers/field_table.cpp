@@ -1,6 +1,5 @@
 #include "nrxctl/printers/field_table.h"
 
-#include "nrxctl/base/fixed_point.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
@@ -11,10 +10,10 @@ namespace {
 
 constexpr double seconds_per_scan_period = 2.56;
 
-// 0 unless both fields came back: half a difference is no number that the device said.
+// Returns 0 unless the report holds both fields, so that no value is made from one of them alone.
 template <class Number>
 Number difference(const reply_fields& fields, const field_row& row) {
-    if (!fields.holds<Number>(row.offset) || !fields.holds<Number>(row.subtrahend)) return 0;
+    if (!fields.contains<Number>(row.offset) || !fields.contains<Number>(row.subtrahend)) return 0;
     return fields.number<Number>(row.offset) - fields.number<Number>(row.subtrahend);
 }
 
@@ -31,7 +30,7 @@ void append_value(text_line& line, const field_row& row, const reply_fields& fie
         case field_kind::u64:
             line.number(fields.u64(row.offset));
             break;
-        case field_kind::u32_above_bit0:
+        case field_kind::u32_high_31_bits:
             line.number(fields.u32(row.offset) >> 1);
             break;
         case field_kind::u32_minus:
@@ -40,9 +39,9 @@ void append_value(text_line& line, const field_row& row, const reply_fields& fie
         case field_kind::u64_minus:
             line.number(difference<std::uint64_t>(fields, row));
             break;
-        case field_kind::fixed16_single:
+        case field_kind::q16_16:
             line.general(static_cast<float>(fields.s32(row.offset)) /
-                         static_cast<float>(fixed_point_one));
+                         static_cast<float>(q16_16_one));
             break;
         case field_kind::scan_periods:
             line.general(fields.u32(row.offset) * seconds_per_scan_period);
@@ -52,8 +51,8 @@ void append_value(text_line& line, const field_row& row, const reply_fields& fie
 
 }  // namespace
 
-void print_fields(const field_table& table, platform::byte_view report, source_place place) {
-    check_length(report, table.length, place);
+void print_fields(const field_table& table, platform::byte_view report, source_location location) {
+    check_length(report, table.length, location);
     const reply_fields fields(report);
     text_line line;
     for (const field_row& row : table.rows) {
@@ -61,7 +60,7 @@ void print_fields(const field_table& table, platform::byte_view report, source_p
         if (row.kind == field_kind::heading) {
             line.text(row.label);
         } else {
-            line.left(row.label, table.label_width).text(table.separator);
+            line.pad_right(row.label, table.label_width).text(table.separator);
             append_value(line, row, fields);
             line.text(row.unit);
         }

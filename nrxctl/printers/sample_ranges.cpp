@@ -4,7 +4,6 @@
 #include <array>
 #include <cstddef>
 
-#include "nrxctl/base/fixed_point.h"
 #include "nrxctl/base/hex_dump.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
@@ -17,13 +16,13 @@ namespace {
 constexpr std::array<std::string_view, 3> motion_sensors{"accel", "gyro", "compass"};
 constexpr std::size_t record_size = 28;
 
-struct axis {
+struct axis_row {
     std::string_view label;
-    std::size_t lowest;  // offsets of s32 values with 16 fraction bits
+    std::size_t lowest;  // offsets of q16_16 values
     std::size_t highest;
 };
 
-constexpr std::array axes{axis{"x: ", 4, 8}, axis{"y: ", 12, 16}, axis{"z: ", 20, 24}};
+constexpr std::array axes{axis_row{"x: ", 4, 8}, axis_row{"y: ", 12, 16}, axis_row{"z: ", 20, 24}};
 
 void append_signed(text_line& line, double value) {
     line.text(value < 0 ? "" : "+").fixed(value, 6);
@@ -33,17 +32,17 @@ void print_ranges(platform::byte_view report) {
     check_length(report, record_size);
     const reply_fields fields(report);
     print_line(text_line().text("num_samples: ").number(fields.s32(0)).view());
-    for (const axis& one : axes) {
+    for (const axis_row& axis : axes) {
         text_line line;
-        append_signed(line.text(one.label), fields.s32(one.lowest) / fixed_point_one);
-        append_signed(line.text(" - "), fields.s32(one.highest) / fixed_point_one);
+        append_signed(line.text(axis.label), fields.s32(axis.lowest) / q16_16_one);
+        append_signed(line.text(" - "), fields.s32(axis.highest) / q16_16_one);
         print_line(line.view());
     }
 }
 
 }  // namespace
 
-void print_sample_ranges(std::string_view service_name, std::int32_t /*report_id*/,
+void print_sample_ranges(std::string_view service_name, report_id /*id*/,
                          platform::byte_view report) {
     const bool is_motion_sensor = std::find(motion_sensors.begin(), motion_sensors.end(),
                                             service_name) != motion_sensors.end();

@@ -1,11 +1,13 @@
 #include "nrxctl/printers/spi_status.h"
 
+#include <algorithm>
 #include <array>
 #include <cstddef>
 #include <cstdint>
 #include <string_view>
 
 #include "nrxctl/base/hex_dump.h"
+#include "nrxctl/base/name_table.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
@@ -19,64 +21,60 @@ constexpr std::size_t header_size = 9;
 constexpr std::size_t status_size = 17;
 constexpr std::uint8_t status_type = 2;
 
-struct captured_data {
-    std::uint8_t type;
-    std::string_view heading;
-};
+// Captured data, by record type.
+constexpr std::array heading_rows{name_row{0, "MOSI"}, name_row{1, "MISO"},
+                                  name_row{3, "AccelVar"}};
+constexpr name_table headings(heading_rows);
 
-constexpr std::array captured_types{captured_data{0, "MOSI"}, captured_data{1, "MISO"},
-                                    captured_data{3, "AccelVar"}};
-
-struct error_text {
+struct error_row {
     std::uint32_t code;
-    std::string_view before;  // the value of the record stands between the two
+    std::string_view before_value;
     number_base base;
-    std::string_view after;
+    std::string_view after_value;
 };
 
-constexpr std::array error_texts{
-    error_text{0x7001, "errorStatus(0x", number_base::hexadecimal, "), error: bad checksum"},
-    error_text{0x7002, "errorStatus(0x", number_base::hexadecimal,
-               "),  error: corrupted transport header"},
-    error_text{0x7003, "errorStatus(0x", number_base::hexadecimal,
-               "),  error:bad transport header status"},
-    error_text{0x7004, "errorStatus(0x", number_base::hexadecimal, "),  error:spi read error"},
-    error_text{0x7005, "", number_base::decimal, " packet_drops observed"},
+constexpr std::array errors{
+    error_row{0x7001, "errorStatus(0x", number_base::hexadecimal, "), error: bad checksum"},
+    error_row{0x7002, "errorStatus(0x", number_base::hexadecimal,
+              "),  error: corrupted transport header"},
+    error_row{0x7003, "errorStatus(0x", number_base::hexadecimal,
+              "),  error:bad transport header status"},
+    error_row{0x7004, "errorStatus(0x", number_base::hexadecimal, "),  error:spi read error"},
+    error_row{0x7005, "", number_base::decimal, " packet_drops observed"},
 };
 
-text_line heading_of(const reply_fields& fields) {
+text_line begin_line(const reply_fields& fields) {
     text_line line;
     return line.text("\ntimestamp: ").number(fields.u64(0)).text(", ");
 }
 
 void append_error(text_line& line, std::uint32_t code, std::uint32_t value) {
-    for (const error_text& known : error_texts) {
-        if (known.code != code) continue;
-        line.text(known.before);
-        if (known.base == number_base::hexadecimal) {
-            line.hex(value);
-        } else {
-            line.number(static_cast<std::int32_t>(value));
-        }
-        line.text(known.after);
+    const auto* error = std::find_if(errors.begin(), errors.end(),
+                                     [&](const error_row& row) { return row.code == code; });
+    if (error == errors.end()) return;
+    line.text(error->before_value);
+    if (error->base == number_base::hexadecimal) {
+        line.hex(value);
+    } else {
+        line.number(static_cast<std::int32_t>(value));
     }
+    line.text(error->after_value);
 }
 
 void print_status(const reply_fields& fields) {
     const std::uint32_t code = fields.u32(9);
-    text_line line = heading_of(fields);
+    text_line line = begin_line(fields);
     line.text("STATUS: errorCode(0x").hex(code).text("), ");
     append_error(line, code, fields.u32(13));
     print_line(line.view());
 }
 
 void print_captured(platform::byte_view record, std::uint8_t type) {
-    for (const captured_data& known : captured_types) {
-        if (known.type != type) continue;
-        text_line line = heading_of(reply_fields(record));
-        print_line(line.text(known.heading).text(": ").view());
-        hex_dump(record.subspan(header_size));
-    }
+    const std::string_view* heading = headings.find(type);
+    if (heading == nullptr) return;
+    text_line line = begin_line(reply_fields(record));
+    print_line(line.text(*heading).text(": ").view());
+    hex_dump(record.subspan(header_size));
 }
 
 }  // namespace

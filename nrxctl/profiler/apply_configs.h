@@ -1,4 +1,4 @@
-// Configuring both halves of the profiler.
+// Configures both halves of the profiler.
 #pragma once
 
 #include <span>
@@ -7,10 +7,10 @@
 
 namespace nrx {
 
-// Sends the configurations to the coprocessor, if it has a profiler, and to the kernel's driver. A
-// half that does not support one of them says so in a line on standard output, as does a missing
-// driver, and the configurations count as applied. False, with a failure report, for any other
-// refusal.
+// Sends configurations to the coprocessor, if it has a profiler, and to the kernel's driver. If a
+// half does not support one of them, or the driver is missing, a line on standard output says so
+// and the configurations count as applied. Returns false with a failure report if a half refuses
+// them for any other reason.
 bool apply_profiler_configs(std::span<const profiler_config> configs);
 
 }  // namespace nrx

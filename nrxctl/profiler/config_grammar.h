@@ -1,33 +1,45 @@
-// Configurations as users write them: <profiler>:<components>[:<reports>[:<services>]], each but
-// the first a list with commas.
+// The grammar of configuration arguments: the keywords of each profiler and their numbers.
 #pragma once
 
-#include <optional>
+#include <cstdint>
+#include <span>
 #include <string_view>
-#include <vector>
-
-#include "nrxctl/base/argument_words.h"
-#include "nrxctl/profiler/config_words.h"
-#include "nrxctl/profiler/profiler_config.h"
 
 namespace nrx {
 
-// Appends the configurations of all words that are left, taking them. False, with a failure report,
-// at the first word that fails; what came before it stays in configs.
-bool parse_profiler_configs(argument_words& words, std::vector<profiler_config>& configs);
+struct keyword_row {
+    std::string_view keyword;
+    std::uint32_t number;
+};
 
-// Appends a configuration per component of one word. False if the word has too few or too many
-// fields, and, with a failure report, if its profiler or a component is unknown, has too many
-// components or too many services; what came before the failure stays in configs.
-//
-// A component or report word that is no word of the profiler's, where numbers are allowed, must be
-// a number of 32 bits: otherwise the process ends with status 1 after a message on standard output.
-bool parse_profiler_config(std::string_view word, std::vector<profiler_config>& configs);
+// What may follow a component.
+struct report_grammar {
+    std::span<const keyword_row> keywords;  // reports and their bits
+    bool takes_services;
+};
 
-// Fills a configuration that has every report and no services. The component word "stop" stops the
-// profiler; the first report word "stop" disables the component. False, with a failure report, for
-// a component that is not among those of the profiler and may not be a number.
-bool init_profiler_config(const profiler_grammar& profiler, std::string_view component,
-                          std::optional<std::string_view> first_report, profiler_config& config);
+// A component whose reports differ from those of its profiler.
+struct component_reports {
+    std::string_view keyword;
+    report_grammar reports;
+};
+
+struct profiler_grammar {
+    std::string_view keyword;
+    std::uint32_t number;
+    std::span<const keyword_row> components;
+    bool takes_numeric_components = false;
+    bool takes_one_component_only = false;
+    std::string_view all_components = {};     // the component that "all" stands for, if any
+    const report_grammar* reports = nullptr;  // null: reports and services are ignored
+    std::span<const component_reports> special_reports = {};
+};
+
+// Returns the grammar of a profiler, or null if no profiler has that keyword.
+const profiler_grammar* find_profiler_grammar(std::string_view keyword);
+
+// Returns the grammar of the reports of a component, or null if reports are ignored.
+const report_grammar* find_report_grammar(const profiler_grammar& profiler,
+                                          std::string_view component);
 
 }  // namespace nrx

@@ -1,6 +1,7 @@
-// What is asked of the coprocessor's half of the profiler, the interface service "profile". The
-// operations that send or read report their own failures and return the platform's code, as those
-// of the command channel do.
+// The coprocessor's half of the profiler, the interface service "profile".
+//
+// Unless said otherwise, an operation reports its own failures and returns the platform's code, as
+// the operations of the command channel do.
 #pragma once
 
 #include <cstdint>
@@ -13,17 +14,17 @@
 
 namespace nrx {
 
-// Whether the coprocessor has a profiler.
+// Returns true if the coprocessor has a profiler.
 bool fw_profiler_available();
 
-// Sends configurations. Success, and nothing sent, if there is no profiler; else the code of the
-// command; a command that is refused is not reported.
+// Sends configurations. Succeeds and sends nothing if there is no profiler. A command that fails is
+// not reported.
 platform::return_code send_fw_configs(std::span<const profiler_config> configs);
 
-// The active configurations; none if they cannot be read.
+// Returns the active configurations; none, without a failure report, if they cannot be read.
 std::vector<profiler_config> read_fw_configs();
 
-// Tells how long the events are going to be monitored, in microseconds; 0: without end.
+// Sets the duration of a monitor in microseconds; 0 is without end.
 platform::return_code set_monitor_duration(std::uint32_t microseconds);
 
 enum class error_action : std::uint32_t { nothing, panic };
@@ -31,18 +32,18 @@ enum class error_action : std::uint32_t { nothing, panic };
 // Sets what the coprocessor does on an error.
 platform::return_code set_error_action(error_action action);
 
-// Sets the statistics of all event sources back to nothing.
+// Resets the statistics of all event sources.
 platform::return_code clear_event_sources();
 
-// Reads statistics into the room that rows or counts gives, which is cut to what came back: rows as
-// print_event_sources takes them, counts as print_wake_requests does.
+// Read statistics into the buffer that rows (counts) refers to, which is shrunk to the bytes
+// returned: rows of 64 bytes, and 32-bit counts.
 platform::return_code read_event_sources(platform::byte_span& rows);
 platform::return_code read_wake_requests(platform::byte_span& counts);
 
-// Ends all that the coprocessor profiles, without touching the driver's half.
+// Stops all profilers of the coprocessor. The driver's half is unchanged.
 platform::return_code stop_fw_profiler();
 
-// Has the coprocessor hand over at once the events that it has recorded.
+// Has the coprocessor deliver the events that it has recorded at once.
 platform::return_code flush_fw_profiler();
 
 }  // namespace nrx

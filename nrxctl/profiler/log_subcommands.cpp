@@ -1,11 +1,11 @@
 #include <array>
 #include <optional>
 
-#include "nrxctl/base/failure_report.h"
+#include "nrxctl/base/arguments.h"
+#include "nrxctl/base/check.h"
 #include "nrxctl/base/output.h"
-#include "nrxctl/base/profile_records.h"
+#include "nrxctl/base/profile_record.h"
 #include "nrxctl/base/text_line.h"
-#include "nrxctl/base/word_table.h"
 #include "nrxctl/decoders/record_text.h"
 #include "nrxctl/profiler/fw_profiler.h"
 #include "nrxctl/profiler/kernel_profiler.h"
@@ -15,80 +15,81 @@ namespace nrx::profile {
 
 namespace {
 
-// What the words of "get-logs" ask for.
-struct log_choice {
+// The arguments of "get-logs".
+struct log_options {
     bool firmware = false;
     bool errors = false;
     bool human = false;
 };
 
-struct choice_word {
-    std::string_view word;
-    bool log_choice::*chosen;
+struct log_option_row {
+    std::string_view keyword;
+    bool log_options::*option;
 };
 
-constexpr std::array choice_words{
-    choice_word{"errdump", &log_choice::errors},
-    choice_word{"fwdump", &log_choice::firmware},
-    choice_word{"human", &log_choice::human},
+constexpr std::array log_option_rows{
+    log_option_row{"errdump", &log_options::errors},
+    log_option_row{"fwdump", &log_options::firmware},
+    log_option_row{"human", &log_options::human},
 };
 
-std::optional<log_choice> choose_logs(argument_words& words) {
-    log_choice choice;
-    while (const auto word = words.take()) {
-        const choice_word* known = find_word_row(choice_words, *word);
-        if (known == nullptr) return std::nullopt;
-        choice.*(known->chosen) = true;
+// Returns nullopt if an argument is unknown.
+std::optional<log_options> parse_log_options(argument_cursor& arguments) {
+    log_options options;
+    while (const auto argument = arguments.next()) {
+        const log_option_row* row = find_keyword(log_option_rows, *argument);
+        if (row == nullptr) return std::nullopt;
+        options.*(row->option) = true;
     }
-    return choice;
+    return options;
 }
 
-struct action_word {
-    std::string_view word;
+struct error_action_row {
+    std::string_view keyword;
     error_action action;
 };
 
-constexpr std::array action_words{
-    action_word{"panic", error_action::panic},
-    action_word{"nothing", error_action::nothing},
+constexpr std::array error_action_rows{
+    error_action_row{"panic", error_action::panic},
+    error_action_row{"nothing", error_action::nothing},
 };
 
 }  // namespace
 
-void signal_error_dump(argument_words& /*words*/) {
+void signal_error_dump(argument_cursor& /*arguments*/) {
     make_error_dump();
 }
 
-void show_logs(argument_words& words) {
-    const auto choice = choose_logs(words);
-    if (!choice) {
+void show_logs(argument_cursor& arguments) {
+    const auto options = parse_log_options(arguments);
+    if (!options) {
         print_line("Invalid parameter");
         check(false, "false");
         return;
     }
-    const record_printer print = select_record_printer(choice->human);
-    if (choice->firmware || !choice->errors) {
+    const record_printer print = select_record_printer(options->human);
+    if (options->firmware || !options->errors) {
         read_profile_records(print);
         read_profiler_log(print);
         print_line("\n");
     }
-    if (choice->errors) {
+    if (options->errors) {
         print_line("errdump");
-        read_profiler_log(print, stored_records::error_dump);
+        read_profiler_log(print, record_store::error_dump);
         print_line("\n");
     }
 }
 
-// A word that is missing is as invalid as any other.
-void set_action_on_error(argument_words& words) {
-    const std::string_view word = words.take().value_or("");
-    const action_word* known = find_word_row(action_words, word);
-    if (known == nullptr) {
-        print_line(text_line().text("invalid argument: ").text(word).view());
+// A missing argument is invalid, too.
+void set_action_on_error(argument_cursor& arguments) {
+    const std::string_view argument = arguments.next().value_or("");
+    const error_action_row* row = find_keyword(error_action_rows, argument);
+    if (row == nullptr) {
+        print_line(text_line().text("invalid argument: ").text(argument).view());
         return;
     }
-    const platform::return_code kr = nrx::set_error_action(known->action);
-    check_success(kr, "kr == 0 ");
+    const platform::return_code kr = set_error_action(row->action);
+    check_success(kr, condition::kr_is_zero);
 }
 
 }  // namespace nrx::profile

@@ -2,10 +2,9 @@
 
 #include <array>
 
-#include "nrxctl/base/argument_words.h"
+#include "nrxctl/base/arguments.h"
 #include "nrxctl/base/output.h"
-#include "nrxctl/base/subcommand_table.h"
-#include "nrxctl/profiler/interrupt_stop.h"
+#include "nrxctl/profiler/kernel_profiler.h"
 #include "nrxctl/profiler/subcommands.h"
 
 namespace nrx {
@@ -26,7 +25,7 @@ constexpr std::array usage_lines{
     "    nrxctl --profile wqrfw-wakestats",
 };
 
-void help(argument_words& /*words*/) {
+void help(argument_cursor& /*arguments*/) {
     for (const char* line : usage_lines)
         print_line(line);
 }
@@ -52,12 +51,12 @@ constexpr std::array subcommands{
 
 }  // namespace
 
-void profile_command(std::string_view subcommand, std::span<char* const> words, int& index) {
-    const interrupt_stop stop_while_running;
-    argument_words further(words, index);
-    if (run_subcommand(subcommands, subcommand, further)) return;
-    further.put_first(subcommand);
-    profile::run_profile(further);
+void profile_command(std::string_view subcommand, std::span<char* const> arguments, int& index) {
+    const scoped_interrupt_handler interrupt_handler;
+    argument_cursor cursor(arguments, index);
+    if (run_subcommand(subcommands, subcommand, cursor)) return;
+    cursor.prepend(subcommand);
+    profile::run_profile(cursor);
 }
 
 }  // namespace nrx

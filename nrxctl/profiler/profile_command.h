@@ -6,14 +6,13 @@
 
 namespace nrx {
 
-// Carries out a subcommand. Its further words are those of the command line from index on, the
-// option parser's, which goes up with each word that is taken. A subcommand that is none of the
-// known words begins a profiling run, and is its first word.
+// Runs a subcommand. Its arguments are those of the command line from index on, the option parser's
+// index, which advances with each argument read. An unknown subcommand starts a profiling run, of
+// which it is the first argument.
 //
-// Prints on standard output; every failure is a failure report, and there is no result. A word that
-// is no number where one must stand ends the process with status 1. While the command runs, an
-// interrupt asks the driver to end the stream of events. Set tick_period first: without it a
-// duration is never over.
-void profile_command(std::string_view subcommand, std::span<char* const> words, int& index);
+// Prints on standard output. Every failure is reported; there is no result. An invalid number ends
+// the process with status 1. While the command runs, an interrupt asks the driver to end the stream
+// of events. Set tick_period first: without it a duration never expires.
+void profile_command(std::string_view subcommand, std::span<char* const> arguments, int& index);
 
 }  // namespace nrx

@@ -1,11 +1,11 @@
-// The configuration of one profiler component, as both halves of the profiler take and return it.
+// The configuration of one profiler component: its wire format, which both halves of the profiler
+// share, and its text.
 #pragma once
 
 #include <array>
 #include <cstddef>
 #include <cstdint>
 #include <span>
-#include <string>
 #include <string_view>
 #include <vector>
 
@@ -13,37 +13,50 @@
 
 namespace nrx {
 
+// The profilers. Their numbers are the categories of their events.
+namespace profiler_number {
+
+inline constexpr std::uint32_t exec = 0;
+inline constexpr std::uint32_t trace = 1;
+inline constexpr std::uint32_t sensor = 2;
+inline constexpr std::uint32_t orrin = 3;
+inline constexpr std::uint32_t talvor = 4;
+inline constexpr std::uint32_t interrupt = 5;
+inline constexpr std::uint32_t uart = 6;
+inline constexpr std::uint32_t scm = 9;
+inline constexpr std::uint32_t wake = 10;
+
+}  // namespace profiler_number
+
 enum class profiler_state : std::uint32_t { enable, disable, stop };
 
-inline constexpr std::array<std::string_view, 3> profiler_state_names{"enable", "disable", "stop"};
-
-// On the wire a record is 52 bytes of little-endian 32-bit words, in the order of the members and
-// with one more word behind them that is 0.
+// A record on the wire is 52 bytes: little-endian 32-bit words in the order of the members,
+// followed by a word that is 0.
 struct profiler_config {
     static constexpr std::size_t wire_size = 52;
 
-    std::uint32_t profiler = 0;                     // its number, the category of its events
-    std::uint32_t component = 0;                    // its number within the profiler
-    profiler_state state = profiler_state::enable;  // any value in a record of the driver's
-    std::uint32_t reports = 0xffffffff;             // mask, a bit per report category
-    std::array<std::uint32_t, 8> services = {};     // codes, ended by the first 0
+    std::uint32_t profiler = 0;                     // a profiler_number, if the driver sends one
+    std::uint32_t component = 0;                    // as the profiler numbers its components
+    profiler_state state = profiler_state::enable;  // the driver may send any value
+    std::uint32_t reports = 0xffffffff;             // mask, one bit per kind of report
+    std::array<std::uint32_t, 8> services = {};     // service codes, terminated by the first 0
 };
 
-// The most records that a half of the profiler reports back.
-inline constexpr std::size_t most_active_configs = 20;
+// The number of records that a half of the profiler returns at most.
+inline constexpr std::size_t max_active_configs = 20;
 
-// The first four characters of a service name, the first in the lowest byte; a shorter name is
-// padded with 0.
+// Returns the first four characters of a service name, the first in the lowest byte. A shorter name
+// is padded with zeros.
 std::uint32_t service_code(std::string_view name);
 
-// The characters of a service code up to the first 0, at most four, with a blank before each code.
-// Ends at the first code that is 0.
-std::string service_text(std::span<const std::uint32_t> codes);
-
-// Records back to back.
+// Returns the records, one after the other.
 std::vector<std::uint8_t> encode_configs(std::span<const profiler_config> configs);
 
-// The whole records in a reply; what is left over is ignored.
+// Returns the complete records of a reply. Trailing bytes are ignored.
 std::vector<profiler_config> decode_configs(platform::byte_view reply);
+
+// Prints a configuration as a line on standard output. Profilers and components have the names that
+// the decoders give them.
+void print_profiler_config(const profiler_config& config);
 
 }  // namespace nrx

@@ -6,14 +6,14 @@
 
 namespace nrx {
 
-// Configures the coprocessor's half of the profiler as the words of the command line from index on
-// say (taking all of them, if the coprocessor has one), prints the bus transfers and their data for
-// the duration ("auto" or milliseconds), and stops the profiling of transfers. The profiler is
-// enabled for that long, unless a client is connected already.
+// Configures the coprocessor's half of the profiler as the arguments from index on say, prints the
+// bus transfers and their data for a duration ("auto" or milliseconds), then stops the profiling of
+// transfers. The profiler is enabled meanwhile, unless a client is connected already. All arguments
+// are read, unless the coprocessor has no profiler.
 //
-// Every failure is a failure report, and there is no result. A duration that is no number, or a
-// number in a word that is none, ends the process with status 1. An interrupt asks the driver to
-// end the stream of events. Set tick_period first: without it a duration is never over.
-void scm_monitor(std::string_view duration, std::span<char* const> words, int& index);
+// Every failure is reported; there is no result. An invalid number ends the process with status 1.
+// While the monitor runs, an interrupt asks the driver to end the stream of events. Set tick_period
+// first: without it a duration never expires.
+void scm_monitor(std::string_view duration, std::span<char* const> arguments, int& index);
 
 }  // namespace nrx

@@ -1,31 +1,31 @@
-// The subcommands of the profiler command family. Each takes its own words and reports its own
+// The subcommands of the profiler command family. Each reads its own arguments and reports its own
 // failures.
 #pragma once
 
-#include "nrxctl/base/argument_words.h"
+#include "nrxctl/base/arguments.h"
 
 namespace nrx::profile {
 
-// Statistics.
-void clear_event_source_statistics(argument_words& words);
-void show_event_sources(argument_words& words);
-void show_wake_requests(argument_words& words);
+// control_subcommands.cpp
+void enable(argument_cursor& arguments);
+void disable(argument_cursor& arguments);
+void stop(argument_cursor& arguments);
+void flush(argument_cursor& arguments);
+void configure(argument_cursor& arguments);
+void show_configs(argument_cursor& arguments);
+void monitor(argument_cursor& arguments);
 
-// State and configuration.
-void enable(argument_words& words);
-void disable(argument_words& words);
-void stop(argument_words& words);
-void flush(argument_words& words);
-void configure(argument_words& words);
-void show_configs(argument_words& words);
+// A complete profiling run: configures, enables, monitors, and disables again.
+void run_profile(argument_cursor& arguments);
 
-// Logs and errors.
-void signal_error_dump(argument_words& words);
-void show_logs(argument_words& words);
-void set_action_on_error(argument_words& words);
+// log_subcommands.cpp
+void signal_error_dump(argument_cursor& arguments);
+void show_logs(argument_cursor& arguments);
+void set_action_on_error(argument_cursor& arguments);
 
-// Monitoring.
-void monitor(argument_words& words);
-void run_profile(argument_words& words);
+// statistics_subcommands.cpp
+void clear_event_source_statistics(argument_cursor& arguments);
+void show_event_sources(argument_cursor& arguments);
+void show_wake_requests(argument_cursor& arguments);
 
 }  // namespace nrx::profile

@@ -11,38 +11,43 @@
 
 namespace nrx {
 
-// Holds a part of the file at a time, at least one line.
+// Buffers a part of the file, at least one line.
 class line_reader {
 public:
-    explicit line_reader(const std::string& path);
+    static constexpr std::size_t default_capacity = std::size_t{1} << 17;
 
-    // Whether the file is open, and all reading of it went well so far.
+    // Opens a file. The capacity of the buffer, at least 1, grows with the longest line.
+    explicit line_reader(const std::string& path, std::size_t capacity = default_capacity);
+
+    // Returns true if the file is open and every read has succeeded so far.
     [[nodiscard]] bool good() const;
 
-    // The size of the file in bytes, 0 if it is not known before it is read.
+    // Returns the size of the file in bytes, or 0 if it is unknown before the file is read.
     [[nodiscard]] std::size_t file_size() const;
 
-    // The next line without its line feed, valid until the next call; none at the end of what can
-    // be read. A last line needs no line feed.
+    // Returns the next line without its line feed, valid until the next call. Returns nullopt at
+    // the end of what can be read. The last line needs no line feed.
     std::optional<std::string_view> next();
 
-    // What was read and not taken yet, which may end within a line; valid until the next call.
-    [[nodiscard]] std::string_view at_hand() const {
+    // The bytes that were read and not consumed yet. They may end within a line, and are valid
+    // until the next call of next().
+    [[nodiscard]] std::string_view buffered() const {
         return {buffer_.data() + begin_, end_ - begin_};
     }
 
-    // Takes so many bytes of what is at hand, which must be whole lines with their line feeds.
-    void pass(std::size_t size) { scanned_ = begin_ += size; }
+    // Consumes that many buffered bytes, which must be complete lines with their line feeds.
+    void consume(std::size_t size) { scanned_ = begin_ += size; }
 
 private:
     bool read_more();
-    std::string_view take_until(std::size_t line_end);
+    std::string_view extract_until(std::size_t line_end);
 
     std::unique_ptr<std::FILE, int (*)(std::FILE*)> file_;
     std::vector<char> buffer_;
-    std::size_t begin_ = 0;    // of what was read and not taken
-    std::size_t scanned_ = 0;  // no line feed before this
-    std::size_t end_ = 0;
+    // Positions in the buffer.
+    std::size_t begin_ = 0;    // of the first byte not consumed
+    std::size_t scanned_ = 0;  // no line feed between begin_ and here
+    std::size_t end_ = 0;      // after the last byte read
 };
 
 }  // namespace nrx

@@ -2,12 +2,12 @@
 
 #include <array>
 
-#include "nrxctl/base/argument_words.h"
+#include "nrxctl/base/arguments.h"
 #include "nrxctl/base/output.h"
-#include "nrxctl/base/subcommand_table.h"
 #include "nrxctl/base/text_line.h"
-#include "nrxctl/replay/signal_request.h"
-#include "nrxctl/replay/subcommands.h"
+#include "nrxctl/replay/generate_samples.h"
+#include "nrxctl/replay/load_samples.h"
+#include "nrxctl/replay/replay_state.h"
 
 namespace nrx {
 
@@ -27,12 +27,8 @@ constexpr std::array usage_lines{
     "    nrxctl --replay help",
 };
 
-void help(argument_words& /*words*/) {
+void help(argument_cursor& /*arguments*/) {
     print_replay_usage();
-}
-
-void generate(argument_words& words) {
-    if (const auto request = read_signal_request(words)) generate_samples(*request);
 }
 
 constexpr std::array subcommands{
@@ -43,7 +39,7 @@ constexpr std::array subcommands{
     subcommand_row{"enable", replay::enable},
     subcommand_row{"disable", replay::disable},
     subcommand_row{"get-status", replay::show_status},
-    subcommand_row{"generate", generate},
+    subcommand_row{"generate", replay::generate},
 };
 
 }  // namespace
@@ -53,9 +49,9 @@ void print_replay_usage() {
         print_line(line);
 }
 
-void replay_command(std::string_view subcommand, std::span<char* const> words, int& index) {
-    argument_words further(words, index);
-    if (run_subcommand(subcommands, subcommand, further)) return;
+void replay_command(std::string_view subcommand, std::span<char* const> arguments, int& index) {
+    argument_cursor cursor(arguments, index);
+    if (run_subcommand(subcommands, subcommand, cursor)) return;
     print_line(text_line().text("Invalid subcommand ").text(subcommand).text("\n").view());
     print_replay_usage();
 }

@@ -1,36 +1,38 @@
 #include "nrxctl/replay/replay_state.h"
 
 #include <array>
+#include <string>
 
+#include "nrxctl/base/check.h"
 #include "nrxctl/base/command_channel.h"
-#include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/little_endian.h"
+#include "nrxctl/base/name_table.h"
+#include "nrxctl/base/numbers.h"
+#include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
-#include "nrxctl/base/service_discovery.h"
-#include "nrxctl/base/whole_records.h"
-#include "nrxctl/replay/replay_app.h"
+#include "nrxctl/base/services.h"
+#include "nrxctl/base/text_line.h"
 
 namespace nrx {
 
 namespace {
 
-constexpr std::size_t most_entries = 32;
+// The report with the state of every service, read and written.
+constexpr report_id state_report = 0x47;
 
-void append_entry(std::vector<std::uint8_t>& report, const replay_state_entry& entry) {
-    append_words(report, {entry.service_id, entry.delay, entry.state});
-}
+constexpr std::size_t max_entries = 32;
 
 }  // namespace
 
 std::vector<replay_state_entry> replay_status() {
-    std::array<std::uint8_t, most_entries * replay_state_entry::wire_size> buffer{};
+    std::array<std::uint8_t, max_entries * replay_state_entry::wire_size> buffer{};
     platform::byte_span report = buffer;
-    const auto kr = get_report(replay_app::service_name, replay_app::state_report, report);
+    const auto kr = get_report(replay_app_name, state_report, report);
     if (kr != platform::success) return {};
     std::vector<replay_state_entry> entries;
     for_each_record(report, replay_state_entry::wire_size, [&](platform::byte_view entry) {
         const reply_fields fields(entry);
-        entries.push_back({fields.u32(0), fields.u32(4), fields.u32(8)});
+        entries.push_back({fields.s32(0), fields.u32(4), fields.u32(8)});
     });
     return entries;
 }
@@ -39,13 +41,81 @@ void set_replay_state(std::span<const std::string_view> services, std::uint32_t 
                       std::uint32_t state) {
     std::vector<std::uint8_t> report;
     for (const std::string_view service : services) {
-        std::int32_t id = 0;
+        service_id id = 0;
         const bool success = resolve_service_id(service, id);
-        if (!check(success, "success")) return;
-        append_entry(report, {static_cast<std::uint32_t>(id), delay, state});
+        if (!check(success, condition::success)) return;
+        append_words(report, {static_cast<std::uint32_t>(id), delay, state});
     }
-    const auto kr = set_report(replay_app::service_name, replay_app::state_report, report);
-    check_success(kr, "kr == 0 ");
+    const auto kr = set_report(replay_app_name, state_report, report);
+    check_success(kr, condition::kr_is_zero);
 }
+
+namespace replay {
+
+namespace {
+
+constexpr std::array state_rows{
+    name_row{replay_state::inactive, "inactive"},
+    name_row{replay_state::loaded, "loaded"},
+    name_row{replay_state::enabled, "enabled"},
+};
+constexpr name_table state_names(state_rows);
+
+// Sets the state of the services that the remaining arguments name.
+void set_state(argument_cursor& arguments, std::uint32_t delay, std::uint32_t state) {
+    std::vector<std::string_view> services;
+    while (const auto service = arguments.next())
+        services.push_back(*service);
+    if (!check(!services.empty(), condition::arguments_remain)) return;
+    set_replay_state(services, delay, state);
+}
+
+void print_entry(const replay_state_entry& entry) {
+    constexpr std::size_t name_width = 10;
+    std::string name;
+    if (!service_name_for_id(entry.service_id, name))
+        name = std::to_string(static_cast<std::uint32_t>(entry.service_id));
+    text_line line;
+    line.text("Service ").pad_right(name, name_width).text(" is ");
+    if (const std::string_view* state_name = state_names.find(entry.state)) {
+        line.text(*state_name);
+    } else {
+        line.number(entry.state);
+    }
+    print_line(line.view());
+}
+
+}  // namespace
+
+bool is_enabled() {
+    if (!replay_status().empty()) return true;
+    print_line("Replay is not enabled");
+    return false;
+}
+
+void enable(argument_cursor& arguments) {
+    if (is_enabled()) set_state(arguments, 0, replay_state::enabled);
+}
+
+void disable(argument_cursor& arguments) {
+    if (is_enabled()) set_state(arguments, 0, replay_state::loaded);
+}
+
+void schedule_enable(argument_cursor& arguments) {
+    if (!is_enabled()) return;
+    const auto delay_argument = arguments.next();
+    if (!check(delay_argument, condition::arguments_remain)) return;
+    const std::uint32_t delay = parse_low_32_bits(*delay_argument, "invalid delay");
+    set_state(arguments, delay, replay_state::enabled);
+}
+
+void show_status(argument_cursor& /*arguments*/) {
+    if (!is_enabled()) return;
+    print_line("Replay status:");
+    for (const replay_state_entry& entry : replay_status())
+        print_entry(entry);
+}
+
+}  // namespace replay
 
 }  // namespace nrx

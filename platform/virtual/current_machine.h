@@ -1,14 +1,15 @@
-// Which machine the platform functions work on.
+// The machine that the platform functions operate on.
 #pragma once
 
 #include "platform/virtual/machine.h"
 
 namespace platform::simulated {
 
-// The machine that is installed, else the embedded wrist device, which is made at its first use.
+// Returns the installed machine. If none is installed, returns the embedded wrist device, which is
+// created on first use.
 machine& current_machine();
 
-// Installs a machine for as long as this object lives.
+// Installs a machine for the lifetime of this object.
 class installed_machine {
 public:
     explicit installed_machine(machine& device);

@@ -20,23 +20,23 @@ std::shared_ptr<shared_queue> driver::notification(std::uint32_t /*type*/) {
 
 namespace {
 
-bool fits(presence wanted, std::size_t given) {
-    return wanted == presence::optional || (wanted == presence::required) == (given > 0);
+bool satisfies(argument_rule rule, std::size_t size) {
+    return rule == argument_rule::optional || (rule == argument_rule::required) == (size > 0);
 }
 
 }  // namespace
 
-return_code check_shape(const method_shape& shape, const call_inputs& inputs,
-                        const call_outputs& outputs) {
-    const bool fitting = inputs.scalars.size() == shape.scalars_in &&
-                         outputs.scalars.size() == shape.scalars_out &&
-                         fits(shape.structure_in, inputs.structure.size()) &&
-                         fits(shape.structure_out, outputs.structure.size());
-    return fitting ? success : bad_argument;
+return_code check_arguments(const method_signature& signature, const call_inputs& inputs,
+                            const call_outputs& outputs) {
+    const bool matches = inputs.scalars.size() == signature.scalars_in &&
+                         outputs.scalars.size() == signature.scalars_out &&
+                         satisfies(signature.structure_in, inputs.structure.size()) &&
+                         satisfies(signature.structure_out, outputs.structure.size());
+    return matches ? success : bad_argument;
 }
 
-return_code answer(byte_view reply, call_outputs& outputs) {
-    if (reply.size() > outputs.structure.size()) return no_room;
+return_code copy_reply(byte_view reply, call_outputs& outputs) {
+    if (reply.size() > outputs.structure.size()) return buffer_too_small;
     std::copy(reply.begin(), reply.end(), outputs.structure.begin());
     outputs.structure = outputs.structure.first(reply.size());
     return success;

@@ -1,4 +1,4 @@
-// What stands behind a registry entry: the kernel's side of a connection.
+// The driver of a registry entry: the kernel's side of a connection.
 #pragma once
 
 #include <algorithm>
@@ -12,7 +12,7 @@
 
 namespace platform::simulated {
 
-// A driver answers as a kernel driver would, and checks what it is sent as strictly.
+// Drivers check their arguments as strictly as kernel drivers do.
 class driver {
 public:
     driver() = default;
@@ -22,55 +22,56 @@ public:
     driver& operator=(driver&&) = delete;
     virtual ~driver() = default;
 
-    // Whether a connection of this type may be opened; type 0 unless a driver says otherwise.
+    // Accepts or refuses a connection of the given type. By default only type 0 is accepted.
     virtual return_code open(std::uint32_t type);
 
-    // One method call. On success the spans of outputs are cut to what was returned.
+    // Runs a method. On success the spans of outputs are shrunk to what was returned.
     virtual return_code call(std::uint32_t selector, const call_inputs& inputs,
                              call_outputs& outputs) = 0;
 
-    // The queue in the memory of that type, and the one whose data are signalled as notifications
-    // of that type; null if there is none, as it is unless a driver says otherwise.
+    // The queue in the memory of the given type, and the queue whose data is signalled by
+    // notifications of the given type. By default there is none, and the result is null.
     virtual std::shared_ptr<shared_queue> memory(std::uint32_t type);
     virtual std::shared_ptr<shared_queue> notification(std::uint32_t type);
 };
 
-// Whether a method takes or gives a structure.
-enum class presence { none, optional, required };
+enum class argument_rule { none, optional, required };
 
-// What a driver's method takes and gives, checked before the method runs.
-struct method_shape {
+// The arguments that a method accepts, checked before it runs.
+struct method_signature {
     std::size_t scalars_in;
-    presence structure_in;
+    argument_rule structure_in;
     std::size_t scalars_out;
-    presence structure_out;
+    argument_rule structure_out;
 };
 
-// success if the arguments have the method's shape, else bad_argument.
-return_code check_shape(const method_shape& shape, const call_inputs& inputs,
-                        const call_outputs& outputs);
+// Returns success if the arguments match the signature, otherwise bad_argument.
+return_code check_arguments(const method_signature& signature, const call_inputs& inputs,
+                            const call_outputs& outputs);
 
-// A row in the table of a driver's methods.
+// A row in a driver's table of methods.
 template <class Driver>
 struct method {
     std::uint32_t selector;
-    method_shape shape;
+    method_signature signature;
     return_code (Driver::*run)(const call_inputs& inputs, call_outputs& outputs);
 };
 
-// Runs the method with that selector if the arguments have its shape; unsupported if there is none.
+// Checks the arguments and runs the method with the given selector. Returns unsupported if there is
+// no such method.
 template <class Driver, std::size_t Count>
-return_code run_method(Driver& of, const std::array<method<Driver>, Count>& methods,
+return_code run_method(Driver& target, const std::array<method<Driver>, Count>& methods,
                        std::uint32_t selector, const call_inputs& inputs, call_outputs& outputs) {
     const auto* row = std::find_if(
         methods.begin(), methods.end(),
         [&](const method<Driver>& candidate) { return candidate.selector == selector; });
     if (row == methods.end()) return unsupported;
-    const return_code fitting = check_shape(row->shape, inputs, outputs);
-    return fitting == success ? (of.*row->run)(inputs, outputs) : fitting;
+    const return_code result = check_arguments(row->signature, inputs, outputs);
+    return result == success ? (target.*row->run)(inputs, outputs) : result;
 }
 
-// Answers with reply in the structure output and cuts it to size; no_room if it is too small.
-return_code answer(byte_view reply, call_outputs& outputs);
+// Copies a reply to the structure output and shrinks the span to it. Returns buffer_too_small if
+// the reply does not fit.
+return_code copy_reply(byte_view reply, call_outputs& outputs);
 
 }  // namespace platform::simulated

@@ -1,4 +1,4 @@
-// One entry of the virtual host's driver registry.
+// An entry of the virtual host's driver registry.
 #pragma once
 
 #include <functional>
@@ -8,28 +8,27 @@
 
 #include "platform/property.h"
 #include "platform/virtual/driver.h"
-#include "platform/virtual/hid_unit.h"
-#include "platform/virtual/record_unit.h"
+#include "platform/virtual/hid_sources.h"
 
 namespace platform::simulated {
 
 struct entry {
-    std::string name;                                   // registry name
-    std::vector<std::string> classes = {};              // its class, then the bases of that class
-    dictionary properties = {};                         // ids, locations, usages
-    std::function<void(dictionary&)> refresh = {};      // brings them up to date for a reader
-    std::shared_ptr<driver> unit = nullptr;             // null: nothing to open here
-    std::shared_ptr<hid_unit> hid = nullptr;            // null: no HID device
-    std::shared_ptr<record_unit> records = nullptr;     // null: its driver brings no plug-in
-    std::vector<std::shared_ptr<entry>> children = {};  // in the service plane
-    bool present = true;                                // false once the service is gone
+    std::string name;                                     // registry name
+    std::vector<std::string> classes = {};                // its class, then the base classes
+    dictionary properties = {};                           // ids, locations, usages
+    std::function<void(dictionary&)> refresh = {};        // updates the properties before a read
+    std::shared_ptr<simulated::driver> driver = nullptr;  // null: cannot be opened
+    std::shared_ptr<virtual_hid_device> hid = nullptr;    // null: not a HID device
+    std::shared_ptr<record_source> records = nullptr;     // null: the driver has no plug-in
+    std::vector<std::shared_ptr<entry>> children = {};    // in the service plane
+    bool present = true;                                  // false once the service is gone
 };
 
 using entry_ref = std::shared_ptr<entry>;
 
-// An entry in the words of the call log.
-inline std::string name_of(const entry_ref& one) {
-    return one ? one->name : "nothing";
+// The name of an entry in the call log.
+inline std::string log_name(const entry_ref& provider) {
+    return provider ? provider->name : "nothing";
 }
 
 }  // namespace platform::simulated

@@ -11,7 +11,7 @@
 
 namespace platform::simulated {
 
-// Something that calls back from the event loop.
+// An object that calls back from the event loop.
 class loop_source {
 public:
     loop_source() = default;
@@ -21,25 +21,25 @@ public:
     loop_source& operator=(loop_source&&) = delete;
     virtual ~loop_source() = default;
 
-    // When the next callback comes about if nobody intervenes; none: never.
+    // Time of the next callback; nullopt if there is none.
     [[nodiscard]] virtual std::optional<machine_clock::time> next_due() const = 0;
 
-    // Makes that callback; its time has come.
+    // Makes the next callback, which is due.
     virtual void call_back() = 0;
 };
 
 class event_loop {
 public:
-    // Puts the source of a handle on the loop, where it calls back as often as something is due,
-    // however often it was put there; takes it off again.
+    // Adds the source of a handle to the loop. Adding it again makes no difference.
     void schedule(handle_id owner, const std::shared_ptr<loop_source>& source);
     void unschedule(handle_id owner);
 
-    // Ends the run, or the next one.
-    void stop() { stop_asked_ = true; }
+    // Ends the current run, or the next one if the loop is not running.
+    void stop() { stop_requested_ = true; }
 
-    // Runs until it is stopped or the time has come; with what is due by then calling back.
-    return_code run(machine_clock& clock, std::optional<machine_clock::time> until);
+    // Runs until the loop is stopped or the deadline has passed. Callbacks due at the deadline are
+    // still made. Returns deadlock if the run could never end.
+    return_code run(machine_clock& clock, std::optional<machine_clock::time> deadline);
 
 private:
     struct scheduled_source {
@@ -47,14 +47,14 @@ private:
         std::shared_ptr<loop_source> source;
     };
     struct due_source {
-        machine_clock::time at;
+        machine_clock::time time;
         std::shared_ptr<loop_source> source;
     };
 
     [[nodiscard]] std::optional<due_source> next_source() const;
 
     std::vector<scheduled_source> scheduled_;
-    bool stop_asked_ = false;
+    bool stop_requested_ = false;
 };
 
 }  // namespace platform::simulated

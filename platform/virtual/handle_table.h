@@ -1,4 +1,4 @@
-// What a virtual host has lent out.
+// The objects that are open on a virtual host.
 #pragma once
 
 #include <cstddef>
@@ -13,67 +13,67 @@
 
 namespace platform::simulated {
 
-// What stands behind a handle, kind by kind.
-struct lent_service {
+// One type for each kind of handle.
+struct service_object {
     entry_ref provider;
 };
-struct lent_connection {
+struct connection_object {
     entry_ref provider;
 };
-struct lent_mapping {
+struct mapping_object {
     entry_ref provider;
     std::shared_ptr<shared_queue> queue;
 };
-struct lent_port {
-    std::shared_ptr<shared_queue> queue;  // that signals its data on the port; null if none does
+struct port_object {
+    std::shared_ptr<shared_queue> queue;  // the queue signalled on the port; null if not attached
 };
-struct lent_hid_device {
+struct hid_device_object {
     entry_ref provider;
     bool is_open = false;
 };
-struct lent_hid_plugin {
+struct hid_plugin_object {
     entry_ref provider;
 };
-struct lent_hid_interface {
+struct hid_interface_object {
     std::shared_ptr<record_listener> listener;
 };
-struct lent_hid_event_client {
+struct hid_event_client_object {
     std::shared_ptr<event_listener> listener;
 };
-struct lent_hid_services {
+struct hid_service_list_object {
     std::vector<entry_ref> services;
 };
 
-// A program holds few objects at once, and gives back first what it took last; so they stand in a
-// row, looked for from the end. Lending and taking back in turn allocates nothing.
+// A program holds few objects at a time and releases the newest first, so the objects are kept in a
+// vector that is searched from its end. Alternating insert and erase allocates nothing.
 class handle_table {
 public:
-    using object =
-        std::variant<lent_service, lent_connection, lent_mapping, lent_port, lent_hid_device,
-                     lent_hid_plugin, lent_hid_interface, lent_hid_event_client, lent_hid_services>;
+    using object = std::variant<service_object, connection_object, mapping_object, port_object,
+                                hid_device_object, hid_plugin_object, hid_interface_object,
+                                hid_event_client_object, hid_service_list_object>;
 
-    // Lends an object out under a number of its own.
-    handle_id lend(object lent);
+    // Adds an object and returns its new handle.
+    handle_id insert(object added);
 
-    // The object of a kind with that number, until the next change of the table; null if there is
-    // none.
-    template <class Kind>
-    [[nodiscard]] Kind* find(handle_id id) {
-        object* found = find_any(id);
-        return found == nullptr ? nullptr : std::get_if<Kind>(found);
+    // The object of the given type behind a handle; null if there is none. The pointer is valid
+    // until the table changes.
+    template <class Object>
+    [[nodiscard]] Object* find(handle_id id) {
+        object* match = find_any(id);
+        return match == nullptr ? nullptr : std::get_if<Object>(match);
     }
 
-    // Takes the object with that number back, of whichever kind, if there is one.
-    void take_back(handle_id id);
+    // Removes the object behind a handle, if there is one.
+    void erase(handle_id id);
 
-    // How many objects are out, and HID devices still open, those included whose object was taken
-    // back before they were closed.
-    [[nodiscard]] std::size_t still_open() const;
+    // Number of objects, plus the number of HID devices that are open, including devices whose
+    // object was erased before it was closed.
+    [[nodiscard]] std::size_t open_count() const;
 
 private:
     struct numbered_object {
         handle_id id;
-        object lent;
+        object value;
     };
 
     object* find_any(handle_id id);

@@ -1,27 +1,32 @@
-// The clocks of the virtual host.
+// The clocks and the event loop of the virtual host.
 
 #include <ratio>
 #include <string>
 
 #include "platform/clock.h"
+#include "platform/run_loop.h"
 #include "platform/virtual/current_machine.h"
 #include "platform/virtual/interrupts.h"
 
 namespace platform {
 
+using simulated::current_machine;
+using simulated::machine;
+using simulated::machine_clock;
+
 namespace {
 
-// 24 ticks in a microsecond: a reader that takes ticks for another unit is found out.
+// 24 ticks per microsecond, so that code that mistakes ticks for another unit is found out.
 using tick = std::chrono::duration<std::uint64_t, std::ratio<1, 24'000'000>>;
 
-std::uint64_t ticks_at(simulated::machine_clock::time instant) {
+std::uint64_t ticks_at(machine_clock::time instant) {
     return std::chrono::duration_cast<tick>(instant).count();
 }
 
 }  // namespace
 
 std::uint64_t ticks() {
-    return ticks_at(simulated::current_machine().clock().now());
+    return ticks_at(current_machine().clock().now());
 }
 
 double tick_period() {
@@ -29,19 +34,19 @@ double tick_period() {
 }
 
 void sleep(std::chrono::microseconds duration) {
-    simulated::machine& host = simulated::current_machine();
-    const auto how =
+    machine& host = current_machine();
+    const auto scope =
         host.begin_call([&] { return "sleep " + std::to_string(duration.count()) + " us"; });
-    if (how) return;
+    if (scope.fails()) return;
     const auto end = host.clock().now() + duration;
     while (host.clock().now() < end) {
-        host.clock().pass(end);
+        host.clock().advance(end);
         simulated::serve_interrupt();
     }
 }
 
 clock_reading read_clocks() {
-    const simulated::machine_clock& clock = simulated::current_machine().clock();
+    const machine_clock& clock = current_machine().clock();
     const auto now = clock.now();
     const auto wall = std::chrono::duration_cast<std::chrono::microseconds>(clock.wall_at(now));
     const auto seconds = std::chrono::duration_cast<std::chrono::seconds>(wall);
@@ -49,10 +54,29 @@ clock_reading read_clocks() {
 }
 
 std::optional<calendar_instant> boot_time() {
-    simulated::machine& host = simulated::current_machine();
-    const auto how = host.begin_call([] { return std::string("boot time"); });
-    if (how) return std::nullopt;
+    machine& host = current_machine();
+    const auto scope = host.begin_call([] { return std::string("boot time"); });
+    if (scope.fails()) return std::nullopt;
     return host.boot_time();
+}
+
+return_code run_loop() {
+    machine& host = current_machine();
+    const auto scope = host.begin_call([] { return std::string("run loop"); });
+    if (scope.fails()) return scope.code();
+    return host.loop().run(host.clock(), std::nullopt);
+}
+
+return_code run_loop_for(std::chrono::microseconds duration) {
+    machine& host = current_machine();
+    const auto scope =
+        host.begin_call([&] { return "run loop for " + std::to_string(duration.count()) + " us"; });
+    if (scope.fails()) return scope.code();
+    return host.loop().run(host.clock(), host.clock().now() + duration);
+}
+
+void stop_loop() {
+    current_machine().loop().stop();
 }
 
 }  // namespace platform

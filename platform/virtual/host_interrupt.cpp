@@ -1,4 +1,4 @@
-// The interrupt signal of the virtual host: the signal of the process itself.
+// The interrupt signal of the virtual host, which is the signal of the process itself.
 
 #include <algorithm>
 #include <atomic>
@@ -13,65 +13,65 @@ namespace platform {
 
 namespace {
 
-std::atomic<bool> noted = false;
+std::atomic<bool> pending = false;
 static_assert(std::atomic<bool>::is_always_lock_free);
 
-interrupt_handler registered = nullptr;
+interrupt_handler registered_handler = nullptr;
 bool serving = false;
 
-extern "C" void note_interrupt(int /*signal*/) {
-    noted = true;
+extern "C" void mark_pending(int /*signal*/) {
+    pending = true;
 }
 
-void set_action(void (*action)(int)) {
-    struct sigaction wanted {};
-    wanted.sa_handler = action;
-    wanted.sa_flags = SA_RESTART;
-    ::sigaction(SIGINT, &wanted, nullptr);
+void set_signal_action(void (*action)(int)) {
+    struct sigaction new_action {};
+    new_action.sa_handler = action;
+    new_action.sa_flags = SA_RESTART;
+    ::sigaction(SIGINT, &new_action, nullptr);
 }
 
-timespec as_timespec(std::chrono::nanoseconds duration) {
+timespec to_timespec(std::chrono::nanoseconds duration) {
     const auto seconds = std::chrono::duration_cast<std::chrono::seconds>(duration);
     return {.tv_sec = seconds.count(), .tv_nsec = (duration - seconds).count()};
 }
 
 }  // namespace
 
-void handle_interrupt(interrupt_handler handler) {
-    registered = handler;
-    set_action(note_interrupt);
+void set_interrupt_handler(interrupt_handler handler) {
+    registered_handler = handler;
+    set_signal_action(mark_pending);
 }
 
 void restore_default_interrupt() {
-    set_action(SIG_DFL);
+    set_signal_action(SIG_DFL);
     simulated::serve_interrupt();
-    registered = nullptr;
+    registered_handler = nullptr;
 }
 
 namespace simulated {
 
 void serve_interrupt() {
-    if (serving || registered == nullptr) return;
+    if (serving || registered_handler == nullptr) return;
     serving = true;
-    while (noted.exchange(false))
-        registered();
+    while (pending.exchange(false))
+        registered_handler();
     serving = false;
 }
 
-// The signal is held back while it is decided whether to block, and let in by ppoll together with
-// the wait: none can slip in between.
+// The signal is blocked between the check and the wait, and ppoll unblocks it atomically, so that
+// no interrupt is missed.
 void await_interrupt(std::optional<std::chrono::nanoseconds> timeout) {
-    sigset_t held_back{};
-    sigset_t usual{};
-    ::sigemptyset(&held_back);
-    ::sigaddset(&held_back, SIGINT);
-    ::pthread_sigmask(SIG_BLOCK, &held_back, &usual);
-    if (!noted) {
-        timespec left{};
-        if (timeout) left = as_timespec(std::max(*timeout, std::chrono::nanoseconds(0)));
-        ::ppoll(nullptr, 0, timeout ? &left : nullptr, &usual);
+    sigset_t interrupt_mask{};
+    sigset_t previous_mask{};
+    ::sigemptyset(&interrupt_mask);
+    ::sigaddset(&interrupt_mask, SIGINT);
+    ::pthread_sigmask(SIG_BLOCK, &interrupt_mask, &previous_mask);
+    if (!pending) {
+        timespec remaining{};
+        if (timeout) remaining = to_timespec(std::max(*timeout, std::chrono::nanoseconds(0)));
+        ::ppoll(nullptr, 0, timeout ? &remaining : nullptr, &previous_mask);
     }
-    ::pthread_sigmask(SIG_SETMASK, &usual, nullptr);
+    ::pthread_sigmask(SIG_SETMASK, &previous_mask, nullptr);
 }
 
 }  // namespace simulated

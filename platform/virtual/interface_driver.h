@@ -1,4 +1,4 @@
-// The driver behind an interface service: reports, commands and named properties.
+// The driver of an interface service: reports, commands and named properties.
 #pragma once
 
 #include <cstdint>
@@ -16,47 +16,47 @@ namespace platform::simulated {
 
 using byte_list = std::vector<std::uint8_t>;
 
-// Answers the command channel of an interface service from maps. What is written reads back: a
-// written report, a set property.
+// Serves the command channel of an interface service from maps. Reports and properties that were
+// written read back.
 class interface_driver : public driver {
 public:
-    // Carries out a command: the payload goes in, the reply comes out.
+    // Runs a command with a payload and fills in the reply.
     using command = std::function<return_code(byte_view payload, byte_list& reply)>;
 
-    // Makes a report when it is read: reply may become as long as room. Does what a report that is
-    // written asks for.
-    using report_source = std::function<return_code(std::size_t room, byte_list& reply)>;
+    // Generates a report of at most capacity bytes when it is read.
+    using report_source = std::function<return_code(std::size_t capacity, byte_list& reply)>;
+
+    // Acts on a report when it is written.
     using report_sink = std::function<return_code(byte_view report)>;
 
-    // Gives the service a report; only reports that it has can be read or written.
+    // Acts on the scalar call, which takes any number of scalars.
+    using scalar_method = std::function<return_code(std::span<const std::uint64_t> scalars)>;
+
+    // Adds or replaces a report. A write to a report that does not exist is unsupported.
     void set_report(std::uint32_t id, byte_list bytes) { reports_[id] = std::move(bytes); }
 
-    // Gives the service a report that is made anew whenever it is read.
+    // Adds a report that is generated on each read.
     void set_report_source(std::uint32_t id, report_source source) {
         report_sources_[id] = std::move(source);
     }
 
-    // Hands a report that the service has to sink before it is stored; it is stored on success.
+    // Passes each write of an existing report to the sink. The report is stored if that succeeds.
     void set_report_sink(std::uint32_t id, report_sink sink) {
         report_sinks_[id] = std::move(sink);
     }
 
-    // Takes a report away again.
     void drop_report(std::uint32_t id) { reports_.erase(id); }
 
-    // The bytes of a report as they now stand; null if the service has no such report.
+    // The current bytes of a report; null if there is no such report.
     [[nodiscard]] const byte_list* report(std::uint32_t id) const;
 
-    // Gives the service a command; any other command is unsupported.
+    // Adds a command. Other commands are unsupported.
     void set_command(std::uint32_t code, command run) { commands_[code] = std::move(run); }
 
-    // Carries out the service's scalar call, which takes any count of scalars.
-    using scalar_method = std::function<return_code(std::span<const std::uint64_t> scalars)>;
-
-    // Gives the service a scalar call; without one it is unsupported.
+    // Adds the scalar call, which is unsupported otherwise.
     void set_scalar_method(scalar_method run) { scalar_method_ = std::move(run); }
 
-    // Lets the service take and give named properties, and sets one.
+    // Sets a named property. A service without any does not support named properties.
     void set_named_property(std::string_view name, byte_list value);
 
     return_code call(std::uint32_t selector, const call_inputs& inputs,

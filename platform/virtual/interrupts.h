@@ -1,4 +1,4 @@
-// What the virtual host's calls need to know about interrupts.
+// The interrupt signal inside the virtual host.
 #pragma once
 
 #include <chrono>
@@ -6,12 +6,12 @@
 
 namespace platform::simulated {
 
-// Runs the registered handler if an interrupt was noted, but not inside of itself. Every platform
-// call that can fail ends with this; waits, sleeps and the event loop do it inside as well.
+// Runs the registered handler if an interrupt is pending. Does nothing inside the handler itself.
+// Every platform call that can fail ends with this; waits, sleeps and the event loop call it too.
 void serve_interrupt();
 
-// Blocks for that long, or without end, or until an interrupt is noted; not at all if one that was
-// noted is not served yet.
+// Blocks until an interrupt is pending or the timeout, if any, has expired. Returns at once if one
+// is pending already.
 void await_interrupt(std::optional<std::chrono::nanoseconds> timeout);
 
 }  // namespace platform::simulated

@@ -1,4 +1,4 @@
-// What a client holds of the virtual host that calls back from the event loop.
+// Clients of the virtual host that call back from the event loop.
 #pragma once
 
 #include <functional>
@@ -8,12 +8,11 @@
 #include "platform/bytes.h"
 #include "platform/virtual/entry.h"
 #include "platform/virtual/event_loop.h"
-#include "platform/virtual/hid_event_source.h"
-#include "platform/virtual/record_unit.h"
+#include "platform/virtual/hid_sources.h"
 
 namespace platform::simulated {
 
-// A HID device interface: hands on the records of its device.
+// A HID device interface. Delivers the records of its device.
 class record_listener final : public loop_source {
 public:
     explicit record_listener(entry_ref device) : provider(std::move(device)) {}
@@ -27,7 +26,7 @@ public:
     std::function<void(byte_view)> on_record;
 };
 
-// A client of the HID event system: hands on the news of its source.
+// A client of the HID event system. Delivers the notifications of its source.
 class event_listener final : public loop_source {
 public:
     explicit event_listener(std::unique_ptr<hid_event_source> source)

@@ -5,8 +5,8 @@
 
 namespace platform::simulated {
 
-entry_ref machine::add(entry described, const entry_ref& parent) {
-    auto added = std::make_shared<entry>(std::move(described));
+entry_ref machine::add(entry description, const entry_ref& parent) {
+    auto added = std::make_shared<entry>(std::move(description));
     if (parent) parent->children.push_back(added);
     entries_.push_back(added);
     for (const std::string& name : added->classes)
@@ -15,40 +15,40 @@ entry_ref machine::add(entry described, const entry_ref& parent) {
 }
 
 entry_ref machine::find(std::string_view name) const {
-    const auto found = std::find_if(entries_.begin(), entries_.end(), [&](const entry_ref& one) {
-        return one->present && one->name == name;
-    });
-    return found == entries_.end() ? nullptr : *found;
+    const auto match = std::find_if(
+        entries_.begin(), entries_.end(),
+        [&](const entry_ref& candidate) { return candidate->present && candidate->name == name; });
+    return match == entries_.end() ? nullptr : *match;
 }
 
 namespace {
 
-void take_away(entry& gone) {
-    gone.present = false;
-    for (const entry_ref& child : gone.children) {
-        take_away(*child);
+void mark_removed(entry& removed) {
+    removed.present = false;
+    for (const entry_ref& child : removed.children) {
+        mark_removed(*child);
     }
 }
 
 }  // namespace
 
 void machine::remove(std::string_view name) {
-    if (const entry_ref gone = find(name)) take_away(*gone);
+    if (const entry_ref removed = find(name)) mark_removed(*removed);
 }
 
 const std::vector<entry_ref>& machine::entries_of_class(std::string_view name) const {
     static const std::vector<entry_ref> none;
-    const auto found = by_class_.find(name);
-    return found == by_class_.end() ? none : found->second;
+    const auto match = by_class_.find(name);
+    return match == by_class_.end() ? none : match->second;
 }
 
-void machine::take_back(handle_id id) {
+void machine::release_object(handle_id id) {
     loop_.unschedule(id);
-    handles_.take_back(id);
+    handles_.erase(id);
 }
 
-void machine::fail_call(std::size_t n, failure how) {
-    failures_.push_back({calls_made_ + n, how});
+void machine::fail_call(std::size_t n, failure kind) {
+    failures_.push_back({calls_made_ + n, kind});
 }
 
 void machine::before_call(std::size_t n, std::function<void()> action) {
@@ -58,14 +58,14 @@ void machine::before_call(std::size_t n, std::function<void()> action) {
 std::optional<failure> machine::count_call() {
     const std::size_t call = ++calls_made_;
     if (actions_.empty() && failures_.empty()) return std::nullopt;
-    const auto planned_actions = actions_;  // a copy, because an action may plan another
-    for (const planned_action& planned : planned_actions) {
-        if (planned.call == call) planned.run();
+    const auto actions = actions_;  // a copy, because an action may add another
+    for (const injected_action& action : actions) {
+        if (action.call == call) action.run();
     }
-    const auto planned =
+    const auto match =
         std::find_if(failures_.begin(), failures_.end(),
-                     [&](const planned_failure& failing) { return failing.call == call; });
-    return planned == failures_.end() ? std::nullopt : std::optional(planned->how);
+                     [&](const injected_failure& candidate) { return candidate.call == call; });
+    return match == failures_.end() ? std::nullopt : std::optional(match->kind);
 }
 
 }  // namespace platform::simulated

@@ -1,4 +1,4 @@
-// A virtual host: its registry, what it has lent out, and what it was asked.
+// A virtual host: its registry, its open objects, and its log of platform calls.
 #pragma once
 
 #include <functional>
@@ -11,109 +11,135 @@
 
 #include "platform/clock.h"
 #include "platform/handle.h"
-#include "platform/virtual/begun_call.h"
 #include "platform/virtual/entry.h"
 #include "platform/virtual/event_loop.h"
-#include "platform/virtual/failure.h"
 #include "platform/virtual/handle_table.h"
-#include "platform/virtual/hid_event_source.h"
+#include "platform/virtual/hid_sources.h"
+#include "platform/virtual/interrupts.h"
 #include "platform/virtual/machine_clock.h"
+#include "platform/virtual/return_codes.h"
 
 namespace platform::simulated {
 
+// Lives from the start to the end of a platform call. The end of the call is a safe point: it
+// serves a pending interrupt.
+class call_scope {
+public:
+    explicit call_scope(std::optional<failure> injected) : injected_(injected) {}
+    ~call_scope() { serve_interrupt(); }
+    call_scope(const call_scope&) = delete;
+    call_scope& operator=(const call_scope&) = delete;
+    call_scope(call_scope&&) = delete;
+    call_scope& operator=(call_scope&&) = delete;
+
+    // Returns true if a failure was injected into the call. Not for a temporary, which would end
+    // before the call does.
+    [[nodiscard]] bool fails() const& { return injected_.has_value(); }
+    [[nodiscard]] bool fails() const&& = delete;
+
+    // The code that a failing call returns; success if its result is merely empty.
+    [[nodiscard]] return_code code() const { return code_of(*injected_); }
+    [[nodiscard]] bool has_empty_result() const { return injected_ == failure::empty_result; }
+
+private:
+    std::optional<failure> injected_;
+};
+
 class machine {
 public:
-    // Registers an entry, as a child of parent if one is given, and returns it. Its classes do not
-    // change any more.
-    entry_ref add(entry described, const entry_ref& parent = nullptr);
+    // Adds an entry to the registry, as a child of parent if one is given, and returns it. Its
+    // classes must not change afterwards.
+    entry_ref add(entry description, const entry_ref& parent = nullptr);
 
     // The first present entry with a registry name; null if there is none.
     [[nodiscard]] entry_ref find(std::string_view name) const;
 
-    // Takes a service away with all that is attached to it, as when its driver goes down: look-ups
-    // no longer see it, and what is open on it fails with not_found.
+    // Removes a service and everything attached to it, as when its driver terminates. Look-ups no
+    // longer return it, and calls on objects that are open on it fail with not_found.
     void remove(std::string_view name);
 
-    // All entries in registration order, those that are gone included.
+    // All entries in registration order, including those that are gone.
     [[nodiscard]] const std::vector<entry_ref>& entries() const { return entries_; }
 
-    // Those of a class, or of a class derived from it.
+    // The entries of a class or of a class derived from it.
     [[nodiscard]] const std::vector<entry_ref>& entries_of_class(std::string_view name) const;
 
-    // When the host was started; none, at first, if it does not tell.
-    void set_boot_time(calendar_instant booted) { boot_time_ = booted; }
+    // The time at which the host booted; nullopt until it is set.
+    void set_boot_time(calendar_instant boot_time) { boot_time_ = boot_time; }
     [[nodiscard]] std::optional<calendar_instant> boot_time() const { return boot_time_; }
 
-    // The HID event system; none at first.
-    void set_hid_events(hid_event_system events) { hid_events_ = std::move(events); }
-    [[nodiscard]] const hid_event_system& hid_events() const { return hid_events_; }
+    // The HID event system; empty until it is set.
+    void set_hid_events(hid_event_source_factory factory) { hid_events_ = std::move(factory); }
+    [[nodiscard]] const hid_event_source_factory& hid_events() const { return hid_events_; }
 
-    // --- what is lent out ---
+    // --- open objects ---
 
-    // Lends an object out; its handle.
-    handle_id lend(handle_table::object lent) { return handles_.lend(std::move(lent)); }
+    // Adds an object and returns its handle.
+    handle_id open_object(handle_table::object added) { return handles_.insert(std::move(added)); }
 
-    // The object of a kind behind a handle, until the next change of what is lent out; null if
-    // there is none.
-    template <class Kind>
-    [[nodiscard]] Kind* lent(handle_id id) {
-        return handles_.find<Kind>(id);
+    // The object of the given type behind a handle; null if there is none. The pointer is valid
+    // until an object is opened or released.
+    template <class Object>
+    [[nodiscard]] Object* find_object(handle_id id) {
+        return handles_.find<Object>(id);
     }
 
-    // The entry of such an object; null if there is none.
-    template <class Kind>
+    // The entry of such an object; null if there is no such object.
+    template <class Object>
     [[nodiscard]] entry_ref provider(handle_id id) {
-        const Kind* object = lent<Kind>(id);
+        const Object* object = find_object<Object>(id);
         return object == nullptr ? nullptr : object->provider;
     }
 
-    // Takes a handle back, of whichever kind, and its object off the event loop.
-    void take_back(handle_id id);
+    // Removes an object from the table and from the event loop.
+    void release_object(handle_id id);
 
-    // How many handles of all kinds are out, and HID devices still open, those included whose
-    // object was released before it was closed.
-    [[nodiscard]] std::size_t open_handles() const { return handles_.still_open(); }
+    // Number of handles, plus the number of HID devices that are open, including devices whose
+    // handle was released before they were closed.
+    [[nodiscard]] std::size_t open_handles() const { return handles_.open_count(); }
 
     machine_clock& clock() { return clock_; }
 
     // The event loop of the thread.
     event_loop& loop() { return loop_; }
 
-    // --- what was asked ---
+    // --- platform calls ---
 
-    // Every platform call that can fail starts here: it is counted and logged in the words that
-    // describe_call gives. Returns how the call is to fail, if it is, to be kept until its end.
+    // Every platform call that can fail begins here: it is counted and logged with the text that
+    // describe_call returns. The caller keeps the result until the call ends.
     template <class Describe>
-    [[nodiscard]] begun_call begin_call(Describe describe_call) {
+    [[nodiscard]] call_scope begin_call(Describe describe_call) {
         if (recording_) log_.push_back(describe_call());
-        return begun_call(count_call());
+        return call_scope(count_call());
     }
 
-    // Logs an event that is no call of its own (a connection closed).
+    // Logs an event that is not a call itself, such as the release of a handle.
     template <class Describe>
-    void note(Describe describe_event) {
+    void log_event(Describe describe_event) {
         if (recording_) log_.push_back(describe_event());
     }
 
-    // Turns the log on; it is off at first.
+    // Starts recording the log.
     void record_calls() { recording_ = true; }
     [[nodiscard]] const std::vector<std::string>& log() const { return log_; }
     [[nodiscard]] std::size_t calls_made() const { return calls_made_; }
 
-    // Makes the n-th platform call from now (1 is the next) fail.
-    void fail_call(std::size_t n, failure how);
+    // Makes the n-th platform call from now fail; 1 is the next call.
+    void fail_call(std::size_t n, failure kind);
 
-    // Runs an action just before the n-th platform call from now; it may plan further ones.
+    // Runs an action just before the n-th platform call from now. The action may add further
+    // actions and failures.
     void before_call(std::size_t n, std::function<void()> action);
 
 private:
+    // Runs the actions of the next call and returns its failure, if one was injected.
     std::optional<failure> count_call();
 
-    struct planned_failure {
+    struct injected_failure {
         std::size_t call;
-        failure how;
+        failure kind;
     };
-    struct planned_action {
+    struct injected_action {
         std::size_t call;
         std::function<void()> run;
     };
@@ -121,15 +147,15 @@ private:
     std::vector<entry_ref> entries_;
     std::map<std::string, std::vector<entry_ref>, std::less<>> by_class_;
     std::optional<calendar_instant> boot_time_;
-    hid_event_system hid_events_;
+    hid_event_source_factory hid_events_;
     handle_table handles_;
     machine_clock clock_;
     event_loop loop_;
     std::vector<std::string> log_;
     bool recording_ = false;
     std::size_t calls_made_ = 0;
-    std::vector<planned_failure> failures_;
-    std::vector<planned_action> actions_;
+    std::vector<injected_failure> failures_;
+    std::vector<injected_action> actions_;
 };
 
 }  // namespace platform::simulated

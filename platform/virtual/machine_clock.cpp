@@ -24,25 +24,25 @@ machine_clock::time machine_clock::wall_at(time instant) const {
     return wall_now - (host_now() - instant);
 }
 
-bool machine_clock::pass(std::optional<time> until) {
-    if (!follows_host_) return pass_manually(until);
-    await_interrupt(until ? std::optional(*until - host_now()) : std::nullopt);
+bool machine_clock::advance(std::optional<time> deadline) {
+    if (!follows_host_) return advance_manually(deadline);
+    await_interrupt(deadline ? std::optional(*deadline - host_now()) : std::nullopt);
     return true;
 }
 
-bool machine_clock::pass_manually(std::optional<time> until) {
+bool machine_clock::advance_manually(std::optional<time> deadline) {
     const auto next = std::min_element(
-        planned_.begin(), planned_.end(),
-        [](const planned_action& a, const planned_action& b) { return a.at < b.at; });
-    if (next != planned_.end() && (!until || next->at <= *until)) {
-        const planned_action due = std::move(*next);
-        planned_.erase(next);
-        manual_now_ = std::max(manual_now_, due.at);
+        timed_actions_.begin(), timed_actions_.end(),
+        [](const timed_action& a, const timed_action& b) { return a.when < b.when; });
+    if (next != timed_actions_.end() && (!deadline || next->when <= *deadline)) {
+        const timed_action due = std::move(*next);
+        timed_actions_.erase(next);
+        manual_now_ = std::max(manual_now_, due.when);
         due.run();
         return true;
     }
-    if (until) manual_now_ = std::max(manual_now_, *until);
-    return until.has_value();
+    if (deadline) manual_now_ = std::max(manual_now_, *deadline);
+    return deadline.has_value();
 }
 
 }  // namespace platform::simulated

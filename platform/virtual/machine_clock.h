@@ -9,45 +9,46 @@
 
 namespace platform::simulated {
 
-// A manual clock at first: time stands still but for waits and sleeps, which let exactly the time
-// pass that they would take, and take none. Or the clock of the host underneath.
+// Initially a manual clock: only waits and sleeps advance it, by their exact duration and without
+// blocking. It can be switched to the clock of the underlying host.
 class machine_clock {
 public:
     // Time since the clock started.
     using time = std::chrono::nanoseconds;
 
-    // From now on, and for good, the time is that of the host underneath.
+    // Switches to the clock of the underlying host for good.
     void follow_host() { follows_host_ = true; }
 
     [[nodiscard]] time now() const;
 
-    // The same instant on the wall clock, as time since 1970, UTC. The manual clock started at the
-    // time that was set for it.
+    // Converts a time to wall-clock time since 1970, UTC.
     [[nodiscard]] time wall_at(time instant) const;
+
+    // Sets the wall-clock time at which the manual clock started.
     void set_wall_start(time wall) { wall_start_ = wall; }
 
-    // Lets time pass until the given time, or without end, but only up to the next planned action,
-    // which is then carried out, or the next interrupt, which is not served. False if nothing can
-    // ever end it, on the manual clock alone.
-    bool pass(std::optional<time> until);
+    // Waits until the deadline, or without limit. The wait ends early at the next timed action,
+    // which is run, and at the next interrupt, which is left pending. Returns false if nothing can
+    // end the wait; only the manual clock can tell.
+    bool advance(std::optional<time> deadline);
 
-    // Carries out an action at a time of the manual clock.
-    void plan(time at, std::function<void()> action) {
-        planned_.push_back({at, std::move(action)});
+    // Runs an action when the manual clock reaches the given time.
+    void run_at(time when, std::function<void()> action) {
+        timed_actions_.push_back({when, std::move(action)});
     }
 
 private:
-    struct planned_action {
-        time at;
+    struct timed_action {
+        time when;
         std::function<void()> run;
     };
 
-    bool pass_manually(std::optional<time> until);
+    bool advance_manually(std::optional<time> deadline);
 
     bool follows_host_ = false;
     time manual_now_{0};
     time wall_start_{0};
-    std::vector<planned_action> planned_;
+    std::vector<timed_action> timed_actions_;
 };
 
 }  // namespace platform::simulated

@@ -1,5 +1,4 @@
-// The virtual replay application: what its two sides, the interface service and the driver's
-// client, share.
+// The virtual replay application, which has an interface service and a client driver.
 #pragma once
 
 #include <cstdint>
@@ -12,15 +11,15 @@
 
 namespace platform::simulated {
 
-// A service that samples can be played back by.
+// A service that can play back samples.
 struct replay_service {
     std::int32_t id;
-    std::uint32_t record_size;  // bytes; every record begins with this number
+    std::uint32_t record_size;  // bytes; each record begins with this number
 };
 
-// Keeps a state for each service: inactive until samples are loaded, loaded until playback is
-// enabled, enabled until it is disabled, inactive again when they are unloaded. The samples
-// themselves are checked and then forgotten, as nothing is played.
+// Keeps a state for each service. A service is inactive until samples are loaded, then loaded until
+// playback is enabled, enabled until it is disabled, and inactive again once the samples are
+// unloaded. Samples are checked and discarded; nothing is played back.
 class replay_app {
 public:
     static constexpr std::uint32_t inactive = 0;
@@ -33,20 +32,21 @@ public:
     // service.
     [[nodiscard]] byte_list states() const;
 
-    // Enables or disables playback as such entries say. Fails, and changes nothing, with
-    // bad_argument if they are no whole entries or a state is neither loaded nor enabled, with
-    // not_found for a service that plays no samples back, and with not_ready for one without
-    // samples.
+    // Enables or disables playback according to such entries. Fails without changing anything: with
+    // bad_argument if there are no entries, if one is incomplete, or if a state is neither loaded
+    // nor enabled; with not_found if a service cannot play back samples; with not_ready if it has
+    // no samples.
     return_code set_states(byte_view entries);
 
-    // Takes the samples of a service: a header of five words {service id, completion policy,
-    // location, filter, byte count} and as many bytes of records. Fails with bad_argument if any
-    // of this is out of its range or shape, with not_found as above, and with not_ready if the
-    // service has samples.
+    // Loads the samples of a service. The request is a header of five words {service id, completion
+    // policy, location, filter, byte count} and the records. Fails with bad_argument if the request
+    // is malformed or a value is out of range, with not_found if the service cannot play back
+    // samples, and with not_ready if it has samples already.
     return_code load(byte_view request);
 
-    // Forgets the samples of the service whose id the request is. Fails likewise; with not_ready if
-    // it has none.
+    // Unloads the samples of the service whose id is the request. Fails with bad_argument if the
+    // request is malformed, with not_found if the service cannot play back samples, and with
+    // not_ready if it has no samples.
     return_code unload(byte_view request);
 
 private:
@@ -62,10 +62,10 @@ private:
     std::vector<service_state> services_;
 };
 
-// Lets the interface service of the application read and write its state.
+// Adds the state report to the interface service of the application.
 void serve_replay(interface_driver& service, const std::shared_ptr<replay_app>& app);
 
-// The driver of the application's client, which loads and unloads.
+// Creates the driver of the application's client, which loads and unloads samples.
 std::shared_ptr<driver> make_replay_client(std::shared_ptr<replay_app> app);
 
 }  // namespace platform::simulated

@@ -19,10 +19,10 @@ constexpr std::array code_texts{
     code_text{unsupported, "unsupported request"},
     code_text{not_found, "service not found"},
     code_text{simulated::io_failure, "device i/o failure"},
-    code_text{simulated::no_room, "reply larger than the room for it"},
-    code_text{simulated::nothing_queued, "nothing in the queue"},
+    code_text{simulated::buffer_too_small, "reply larger than the room for it"},
+    code_text{simulated::queue_empty, "nothing in the queue"},
     code_text{simulated::not_ready, "not in a state for this"},
-    code_text{simulated::endless_wait, "nothing left to wait for"},
+    code_text{simulated::deadlock, "nothing left to wait for"},
 };
 
 }  // namespace

@@ -7,25 +7,25 @@ namespace platform::simulated {
 
 namespace {
 
-constexpr std::int64_t publishing_interval = 1000000000;
+constexpr std::int64_t nanoseconds_per_second = 1'000'000'000;
 
-// Keeps the property of the service up to date.
+// Updates the property of the service.
 class sync_publisher {
 public:
     explicit sync_publisher(std::function<sync_point()> now) : now_(std::move(now)) {}
 
     void operator()(dictionary& properties) {
         const sync_point point = now_();
-        const std::int64_t interval = point.coprocessor / publishing_interval;
-        if (interval == published_) return;
-        published_ = interval;
+        const std::int64_t second = point.coprocessor / nanoseconds_per_second;
+        if (second == published_second_) return;
+        published_second_ = second;
         properties.set("timesync",
                        dictionary{{"nrx", point.coprocessor}, {"calendar", point.calendar}});
     }
 
 private:
     std::function<sync_point()> now_;
-    std::optional<std::int64_t> published_;  // the interval of the last sync point
+    std::optional<std::int64_t> published_second_;  // second of the last published sync point
 };
 
 }  // namespace

@@ -1,4 +1,4 @@
-// The service that tells how the coprocessor's time and the calendar belong together.
+// The service that relates the coprocessor's time to the calendar.
 #pragma once
 
 #include <cstdint>
@@ -8,15 +8,14 @@
 
 namespace platform::simulated {
 
-// One instant in both times.
+// The same instant in both times.
 struct sync_point {
-    std::int64_t coprocessor;  // nanoseconds of the coprocessor's time
+    std::int64_t coprocessor;  // nanoseconds of the coprocessor's clock
     std::int64_t calendar;     // nanoseconds since 1970, UTC
 };
 
-// Registers a time-sync service. now tells the current instant in both times. The sync point that
-// the service publishes is taken anew when it is read, but at most once in a second of the
-// coprocessor's time.
+// Registers a time-sync service. now returns the current instant in both times. The service renews
+// its published sync point when it is read, but at most once per second of the coprocessor's clock.
 void add_time_sync(machine& host, std::function<sync_point()> now);
 
 }  // namespace platform::simulated

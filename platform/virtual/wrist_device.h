@@ -1,4 +1,4 @@
-// The embedded device: a believable wrist-worn NRX.
+// The embedded device: a wrist-worn NRX.
 #pragma once
 
 #include <memory>
@@ -7,7 +7,7 @@
 
 namespace platform::simulated {
 
-// A new wrist device with every service, report and HID device that the tool can ask about.
+// Creates a wrist device with every service, report and HID device that the tool asks for.
 std::unique_ptr<machine> make_wrist_device();
 
 }  // namespace platform::simulated

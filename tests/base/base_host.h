@@ -1,13 +1,13 @@
-// The services that the base operations work on.
+// A host with the services that base operations need.
 #pragma once
 
 #include "tests/support/device_test.h"
 
 namespace tests {
 
-// Registers "accel" with the id 31, which has the report 0xd0 (1 2 3), the command 0x20 (answers
-// 9 8), the named property "gain" (4 5 6) and a scalar method; "mca"; and the driver of the HID
-// devices, which answers with its input, reversed, and a byte 0xff.
-void put_base_services(machine& host);
+// Adds "accel" with the id 31, the report 0xd0 (1 2 3), the command 0x20 (replies 9 8), the named
+// property "gain" (4 5 6) and a scalar method; "mca"; and the driver of the HID devices, which
+// replies with its input, reversed, and a byte 0xff.
+void add_base_services(machine& host);
 
 }  // namespace tests

@@ -1,10 +1,9 @@
-#include "nrxctl/base/failure_report.h"
-
 #include <string>
 #include <vector>
 
 #include <gtest/gtest.h>
 
+#include "nrxctl/base/check.h"
 #include "nrxctl/base/reply_fields.h"
 #include "tests/support/capture.h"
 
@@ -71,9 +70,9 @@ TEST(check, answers_whether_it_holds_and_names_the_line_where_it_stands) {
         return " bail tests/base/failure_report_test.cpp:" + std::to_string(line + below);
     };
     const std::string begin = "Assertion failed: nrxtoollib: Check failed: ";
-    EXPECT_EQ(failed.err_as_written, begin + "child" + place(2) + "\n" + begin + "result == 0 " +
-                                         place(3) + " out of memory (0xe00002bd)\n" + begin +
-                                         "length >= 2" + place(4) + "\n");
+    EXPECT_EQ(failed.raw_err, begin + "child" + place(2) + "\n" + begin + "result == 0 " +
+                                  place(3) + " out of memory (0xe00002bd)\n" + begin +
+                                  "length >= 2" + place(4) + "\n");
 }
 
 }  // namespace

@@ -2,54 +2,243 @@
 
 #include <array>
 #include <fcntl.h>
+#include <optional>
+#include <pty.h>
 #include <string>
 #include <thread>
 #include <unistd.h>
+#include <vector>
 
-#include <gtest/gtest.h>
+#include "nrxctl/base/services.h"
+#include "nrxctl/base/utf8.h"
+#include "tests/support/device_test.h"
+#include "tests/support/rows.h"
+
+namespace tests {
 
 namespace {
 
-// Sends standard output to a descriptor for as long as it lives.
-class output_to_descriptor {
+// Keeps each write apart, and fails while told to.
+class recording_sink final : public nrx::line_sink {
 public:
-    explicit output_to_descriptor(int descriptor) : saved_(::dup(STDOUT_FILENO)) {
-        ::dup2(descriptor, STDOUT_FILENO);
+    bool write(std::string_view text) override {
+        if (!failing) writes.emplace_back(text);
+        return note_result(!failing);
     }
-    ~output_to_descriptor() {
-        ::dup2(saved_, STDOUT_FILENO);
-        ::close(saved_);
-    }
-    output_to_descriptor(const output_to_descriptor&) = delete;
-    output_to_descriptor& operator=(const output_to_descriptor&) = delete;
 
-private:
-    int saved_;
+    std::vector<std::string> writes;
+    bool failing = false;
 };
 
-TEST(output, arrives_whole_through_a_pipe_that_has_little_room_and_does_not_wait) {
+using strings = std::vector<std::string>;
+
+TEST(descriptor_sink, whole_text_passes_a_small_nonblocking_pipe) {
     std::array<int, 2> ends{};
-    ASSERT_EQ(::pipe(ends.data()), 0);
-    ::fcntl(ends[1], F_SETFL, O_NONBLOCK);
+    ASSERT_EQ(::pipe2(ends.data(), O_NONBLOCK), 0);
     std::string sent;
     for (int i = 0; i < 100000; ++i)
         sent += std::to_string(i) + "\n";
     std::string received;
-    std::thread reader;
-    {
-        const output_to_descriptor redirected(ends[1]);
-        ::close(ends[1]);
-        reader = std::thread([&] {
-            std::array<char, 1000> part;
-            for (ssize_t got = 0; (got = ::read(ends[0], part.data(), part.size())) > 0;) {
-                received.append(part.data(), static_cast<std::size_t>(got));
-            }
-        });
-        nrx::write_output(sent);
-    }
+    ::fcntl(ends[0], F_SETFL, 0);
+    std::thread reader([&] {
+        std::array<char, 1000> buffer;
+        ssize_t count = 0;
+        while ((count = ::read(ends[0], buffer.data(), buffer.size())) > 0)
+            received.append(buffer.data(), static_cast<std::size_t>(count));
+    });
+    nrx::descriptor_sink sink(ends[1]);
+    EXPECT_TRUE(sink.write(sent));
+    EXPECT_FALSE(sink.failed());
+    ::close(ends[1]);
     reader.join();
     ::close(ends[0]);
     EXPECT_EQ(received == sent, true);
+    EXPECT_FALSE(sink.write("x\n"));
+    EXPECT_TRUE(sink.write(""));
+    EXPECT_TRUE(sink.failed());
+}
+
+TEST(terminal_sink, escapes_controls_and_invalid_utf8_alone) {
+    const rows<std::string, std::string> cases{
+        {"µs ∂ \U0001f600\t~ \\x1b\n", "µs ∂ \U0001f600\t~ \\x1b\n"},
+        {"\x1b]0;title\a\n", "\\x1b]0;title\\x07\n"},
+        {std::string("a\0b\r\x1f\x20\x7f\n", 8), "a\\x00b\\x0d\\x1f \\x7f\n"},
+        {"\xc2\x80\xc2\x9f\xc2\xa0\xc2\x7f", "\\xc2\\x80\\xc2\\x9f\xc2\xa0\\xc2\\x7f"},
+        {"\xff\xe2\x88 \xed\xa0\x80", "\\xff\\xe2\\x88 \\xed\\xa0\\x80"},
+        {"\xe2\x88\x82\x9b", "\xe2\x88\x82\\x9b"},
+        {"", ""},
+    };
+    for (const auto& [text, shown] : cases) {
+        nrx::memory_sink memory;
+        nrx::terminal_sink sink(memory);
+        EXPECT_TRUE(sink.write(text));
+        EXPECT_EQ(memory.text(), shown);
+    }
+    recording_sink target;
+    target.failing = true;
+    nrx::terminal_sink sink(target);
+    EXPECT_FALSE(sink.write("x\n"));
+    EXPECT_TRUE(sink.failed());
+}
+
+TEST(block_sink, writes_when_full_flushed_or_destroyed) {
+    constexpr std::size_t block = 65536;
+    recording_sink target;
+    const std::string line(999, 'x');
+    {
+        nrx::block_sink sink(target);
+        for (int i = 0; i < 65; ++i)
+            EXPECT_TRUE(sink.write(line));
+        EXPECT_TRUE(target.writes.empty());
+        sink.write(std::string(block - 65 * 999, 'y'));
+        EXPECT_TRUE(target.writes.empty());
+        sink.write("z");
+        ASSERT_EQ(target.writes.size(), 1U);
+        EXPECT_EQ(target.writes[0].size(), block);
+        EXPECT_TRUE(sink.flush());
+        EXPECT_TRUE(sink.flush());
+        EXPECT_EQ(target.writes.size(), 2U);
+        EXPECT_EQ(target.writes[1], "z");
+        // Text larger than a block is written at once, after what came before.
+        sink.write("before");
+        sink.write(std::string(block + 1, 'l'));
+        ASSERT_EQ(target.writes.size(), 4U);
+        EXPECT_EQ(target.writes[2], "before");
+        EXPECT_EQ(target.writes[3].size(), block + 1);
+        sink.write("last");
+    }
+    EXPECT_EQ(target.writes.back(), "last");
+}
+
+TEST(block_sink, failure_is_reported_from_the_lost_block_on) {
+    recording_sink target;
+    nrx::block_sink sink(target);
+    target.failing = true;
+    EXPECT_TRUE(sink.write("lost\n"));
+    EXPECT_FALSE(sink.flush());
+    target.failing = false;
+    EXPECT_FALSE(sink.write("kept\n"));
+    EXPECT_FALSE(sink.flush());
+    EXPECT_TRUE(sink.failed());
+    EXPECT_EQ(target.writes, strings{"kept\n"});
+}
+
+TEST(scoped_sink, redirects_one_stream_until_it_is_destroyed) {
+    recording_sink out;
+    recording_sink err;
+    recording_sink inner;
+    const nrx::scoped_sink installed_out(nrx::standard_stream::output, out);
+    const nrx::scoped_sink installed_err(nrx::standard_stream::error, err);
+    {
+        const nrx::scoped_sink installed_inner(nrx::standard_stream::output, inner);
+        nrx::print_line("one");
+    }
+    nrx::print_line("two");
+    EXPECT_TRUE(nrx::write_output("three\nfour\n"));
+    nrx::write_error("error\n");
+    out.failing = true;
+    EXPECT_FALSE(nrx::write_output("lost\n"));
+    EXPECT_EQ(inner.writes, strings{"one\n"});
+    EXPECT_EQ(out.writes, (strings{"two\n", "three\nfour\n"}));
+    EXPECT_EQ(err.writes, strings{"error\n"});
+}
+
+TEST(block_output, is_written_before_errors_and_waits) {
+    recording_sink both;
+    const nrx::scoped_sink installed_out(nrx::standard_stream::output, both);
+    const nrx::scoped_sink installed_err(nrx::standard_stream::error, both);
+    {
+        const nrx::block_output blocks;
+        nrx::print_line("one");
+        nrx::print_line("two");
+        nrx::write_error("error\n");
+        nrx::print_line("three");
+        nrx::flush_output();
+        EXPECT_EQ(both.writes.size(), 3U);
+        nrx::print_line("four");
+    }
+    nrx::print_line("five");
+    EXPECT_EQ(both.writes, (strings{"one\ntwo\n", "error\n", "three\n", "four\n", "five\n"}));
+}
+
+// Redirects a standard stream to a new pseudo-terminal.
+class terminal {
+public:
+    explicit terminal(int descriptor) : descriptor_(descriptor), saved_(::dup(descriptor)) {
+        int program_end = -1;
+        EXPECT_EQ(::openpty(&reader_, &program_end, nullptr, nullptr, nullptr), 0);
+        ::dup2(program_end, descriptor_);
+        ::close(program_end);
+    }
+    ~terminal() {
+        ::dup2(saved_, descriptor_);
+        ::close(saved_);
+        ::close(reader_);
+    }
+    terminal(const terminal&) = delete;
+    terminal& operator=(const terminal&) = delete;
+
+    // What was written to the terminal, which adds a carriage return to each line.
+    [[nodiscard]] std::string text() const {
+        std::array<char, 4096> buffer;
+        const ssize_t count = ::read(reader_, buffer.data(), buffer.size());
+        return {buffer.data(), static_cast<std::size_t>(std::max<ssize_t>(count, 0))};
+    }
+
+private:
+    int descriptor_;
+    int saved_;
+    int reader_ = -1;
+};
+
+class program_output : public device_test {};
+
+TEST_F(program_output, device_name_cannot_set_the_title_of_a_terminal) {
+    add_service(host, "\x1b]0;title\a", 1);
+    for (const int descriptor : {STDOUT_FILENO, STDERR_FILENO}) {
+        const terminal screen(descriptor);
+        const nrx::program_output output;
+        if (descriptor == STDERR_FILENO) {
+            nrx::write_error("\x1b[2J\n");
+            EXPECT_EQ(screen.text(), "\\x1b[2J\r\n");
+        } else {
+            nrx::list_services();
+            EXPECT_EQ(screen.text(), "\\x1b]0;title\\x07" + std::string(15, ' ') + "0x1\r\n");
+        }
+    }
+    // A file gets the bytes as they are.
+    const outcome file = capture_descriptors([] {
+        const nrx::program_output output;
+        nrx::list_services();
+    });
+    EXPECT_EQ(file.out.substr(0, 10), "\x1b]0;title\a");
+}
+
+TEST(utf8, is_valid_only_in_well_formed_sequences) {
+    const rows<std::string, bool> cases{
+        {"", true},
+        {"plain \x7f", true},
+        {"\xc2\x80\xdf\xbf", true},
+        {"\xe0\xa0\x80\xec\xbf\xbf\xed\x80\x80\xed\x9f\xbf\xee\x80\x80\xef\xbf\xbf", true},
+        {"\xf0\x90\x80\x80\xf1\x80\x80\x80\xf3\xbf\xbf\xbf\xf4\x8f\xbf\xbf", true},
+        {"\x80", false},
+        {"\xc1\xbf", false},
+        {"\xc2", false},
+        {"\xdf\xc0", false},
+        {"\xe0\x9f\xbf", false},
+        {"\xe1\x80", false},
+        {"\xed\xa0\x80", false},
+        {"\xf0\x8f\xbf\xbf", false},
+        {"\xf1\x7f\x80\x80", false},
+        {"\xf1\x80\xc0\x80", false},
+        {"\xf1\x80\x80\x7f", false},
+        {"\xf4\x90\x80\x80", false},
+        {"\xf5\x80\x80\x80", false},
+    };
+    for (const auto& [text, valid] : cases)
+        EXPECT_EQ(nrx::is_utf8(text), valid) << ::testing::PrintToString(text);
 }
 
 }  // namespace
+
+}  // namespace tests

@@ -6,30 +6,30 @@ namespace tests {
 
 namespace {
 
-constexpr const char* file = "base/service_conn.cpp";
+constexpr const char* file = source_file::service_conn;
 
-using nrx::expected_failure;
+using nrx::on_failure;
 
 class service_conn : public device_test {
 protected:
-    void put_app() {
+    void add_app() {
         const auto app = host.add({.name = "NRXApp", .classes = {"Anything"}});
-        host.add({.name = "client", .unit = std::make_shared<interface_driver>()}, app);
+        host.add({.name = "client", .driver = std::make_shared<interface_driver>()}, app);
     }
 
-    // What is reported when a connection cannot be opened, and how much it still holds then.
-    std::string failing(expected_failure missing, std::size_t held) {
+    // Fails to open a connection that then holds this many handles. Returns the failure report.
+    std::string fail_to_open(on_failure on_missing, std::size_t handles) {
         return capture([&] {
                    nrx::service_conn conn("NRXApp");
-                   EXPECT_FALSE(conn.open(missing));
-                   EXPECT_EQ(host.open_handles(), held);
+                   EXPECT_FALSE(conn.open(on_missing));
+                   EXPECT_EQ(host.open_handles(), handles);
                })
             .err;
     }
 };
 
-TEST_F(service_conn, opens_the_first_child_of_a_service_of_any_class_and_gives_all_back) {
-    put_app();
+TEST_F(service_conn, opens_the_first_child_and_releases_everything) {
+    add_app();
     {
         nrx::service_conn conn("NRXApp");
         EXPECT_FALSE(conn.connection());
@@ -43,18 +43,19 @@ TEST_F(service_conn, opens_the_first_child_of_a_service_of_any_class_and_gives_a
                                         "close client", "release client", "release NRXApp"}));
 }
 
-TEST_F(service_conn, reports_what_fails_and_is_quiet_only_about_a_missing_service) {
+TEST_F(service_conn, failed_step_is_reported_but_a_missing_service_if_ignored) {
     host.add({.name = "WQR_NRXApp"});
-    EXPECT_EQ(failing(expected_failure::is_reported, 0), failed(file, "service"));
-    EXPECT_EQ(failing(expected_failure::is_silent, 0), "");
+    EXPECT_EQ(fail_to_open(on_failure::report, 0), library_report(file, "service"));
+    EXPECT_EQ(fail_to_open(on_failure::ignore, 0), "");
     host.add({.name = "NRXApp"});
-    EXPECT_EQ(failing(expected_failure::is_silent, 1), failed(file, "child"));
+    EXPECT_EQ(fail_to_open(on_failure::ignore, 1), library_report(file, "child"));
     host.remove("NRXApp");
-    put_app();
+    add_app();
     host.fail_call(3, failure::no_memory);
-    EXPECT_EQ(failing(expected_failure::is_silent, 2), failed(file, "kr == 0 ", no_memory_text));
-    host.fail_call(3, failure::nothing);
-    EXPECT_EQ(failing(expected_failure::is_reported, 2), failed(file, "connect"));
+    EXPECT_EQ(fail_to_open(on_failure::ignore, 2),
+              library_report(file, "kr == 0 ", no_memory_text));
+    host.fail_call(3, failure::empty_result);
+    EXPECT_EQ(fail_to_open(on_failure::report, 2), library_report(file, "connect"));
 }
 
 }  // namespace

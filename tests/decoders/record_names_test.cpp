@@ -1,119 +1,88 @@
-// What the four identifier bytes are called, every value of each.
 #include <map>
-#include <string>
-#include <vector>
 
+#include "nrxctl/decoders/category_decoders.h"
 #include "tests/decoders/event_record.h"
 #include "tests/support/device_test.h"
 
 namespace {
 
-using names = std::map<int, std::string>;
+using namespace tests;
+using record_names = device_test;
 
-names numbered(std::initializer_list<const char*> from_zero) {
-    names all;
-    for (const char* name : from_zero)
-        all.emplace(static_cast<int>(all.size()), name);
+// The names that the records of a member's 256 values show under a key, as "number name "; a value
+// that is shown as its number is left out.
+std::string names(const std::string& key, std::uint8_t record_ids::*member, record_ids ids) {
+    std::string all;
+    for (int value = 0; value < 256; ++value) {
+        ids.*member = static_cast<std::uint8_t>(value);
+        const std::string line = decoded(make_record(ids));
+        const auto begin = line.find('\'', line.find(" '" + key + "':") + key.size() + 4) + 1;
+        const std::string name = line.substr(begin, line.find('\'', begin) - begin);
+        const std::string number = std::to_string(value);
+        if (name != number) all.append(number).append(" ").append(name).append(" ");
+    }
     return all;
 }
 
-const names categories{
-    {0, "exec"},      {1, "trace"}, {2, "sensor"},  {3, "orrin"}, {4, "talvor"},
-    {5, "interrupt"}, {6, "uart"},  {8, "control"}, {9, "scm"},   {10, "wake"},
-};
-const names types = numbered({"stop", "long-data", "short-data", "event", "trigger", "function",
-                              "kpdx-context1", "kpdx-context2", "sensorinfo", "extfunction",
-                              "kpdx-context", "annotation", "decimationinfo"});
-
-const std::map<int, names> components{
-    {0, numbered({"scheduler", "function", "workloop", "command", "extfunction", "timing"})},
-    {1, numbered({"remoteq", "endpoint", "systick", "interrupt"})},
-    {2, numbered({"accel", "gyro", "compass", "pressure", "gostin", "als", "temperature"})},
-    {3, {{0, "orrin"}}},
-    {4, {{0, "talvor"}}},
-    {5, {{0, "gpio"}}},
-    {6, numbered({"uart0", "uart1", "uart2"})},
-    {9, numbered({"spi0", "smb0", "smb1", "i2cm0", "i2c_ctrl0", "i2c_ctrl1"})},
-    {10, {{0, "wake"}}},
-};
-
-// By component; the last row serves every component behind it.
-const names sensor_events{
-    {0, "latency"},          {1, "rawdata"},     {2, "data"},        {3, "filtdata"},
-    {4, "apdata"},           {5, "regwrite"},    {6, "regread"},     {7, "update"},
-    {8, "filter-state"},     {9, "sensor-info"}, {10, "annotation"}, {16, "trigger-magnitude"},
-    {17, "trigger-latency"},
-};
-const std::map<int, std::vector<names>> events{
-    {0,
-     {numbered({"context-switch", "prevent-nap", "thread-state"}),
-      {{0, "function"}},
-      numbered({"action", "signal"}),
-      numbered({"start", "finalize", "new-packet", "receive", "timeout", "live-report",
-                "hist-report", "user-report"}),
-      {{0, "extfunction"}},
-      {}}},
-    {2, {sensor_events}},
-    {3, {{{0, "latency"}, {1, "monitor"}, {17, "trigger-latency"}}}},
-    {4, {numbered({"data-in", "data-out"})}},
-    {5, {{{0, "latency"}}}},
-    {6,
-     {numbered({"preamble", "sw-handshake", "hw-handshake", "trace", "packet", "baseband",
-                "transport", "wqr-test"})}},
-    {10, {numbered({"wake-req-stats", "wake-req-info", "wake-event-info"})}},
-};
-
-std::string name_in(const names& table, int id) {
-    const auto found = table.find(id);
-    return found == table.end() ? std::to_string(id) : found->second;
-}
-
-std::string component_name(int category, int component) {
-    const auto found = components.find(category);
-    return found == components.end() ? std::to_string(component)
-                                     : name_in(found->second, component);
-}
-
-std::string event_name(int category, int component, int event) {
-    const auto found = events.find(category);
-    if (found == events.end()) return std::to_string(event);
-    const auto row =
-        std::min<std::size_t>(static_cast<std::size_t>(component), found->second.size() - 1);
-    return name_in(found->second[row], event);
-}
-
-std::string field(const std::string& key, const std::string& name, std::size_t width) {
-    const std::string quoted = "'" + name + "'";
-    return " '" + key + "':" + std::string(quoted.size() < width ? width - quoted.size() : 0, ' ') +
-           quoted + ",";
-}
-
-class event_names : public tests::device_test {
-protected:
-    static void expect_names(int category, int component, int event, int type) {
-        const std::string expected = "{ " + field("category", name_in(categories, category), 8) +
-                                     field("component", component_name(category, component), 8) +
-                                     field("event", event_name(category, component, event), 12) +
-                                     field("type", name_in(types, type), 12) +
-                                     " 'timestamp':      8123,";
-        const auto byte = [](int id) { return static_cast<std::uint8_t>(id); };
-        const auto line = tests::decoded(
-            tests::record_of({byte(category), byte(component), byte(event), byte(type)}));
-        EXPECT_EQ(line.substr(0, expected.size()), expected);
+TEST_F(record_names, every_value_of_category_and_type) {
+    for (const std::uint8_t other : {std::uint8_t{0}, std::uint8_t{255}}) {
+        EXPECT_EQ(names("category", &record_ids::category, {0, other, other, other}),
+                  "0 exec 1 trace 2 sensor 3 orrin 4 talvor 5 interrupt 6 uart 8 control 9 scm "
+                  "10 wake ");
+        EXPECT_EQ(names("type", &record_ids::type, {other, other, other, 0}),
+                  "0 stop 1 long-data 2 short-data 3 event 4 trigger 5 function 6 kpdx-context1 "
+                  "7 kpdx-context2 8 sensorinfo 9 extfunction 10 kpdx-context 11 annotation "
+                  "12 decimationinfo ");
     }
-};
+}
 
-TEST_F(event_names, every_value_of_every_identifier) {
-    for (int id = 0; id < 256; ++id) {
-        expect_names(id, 0, 0, 0);
-        expect_names(id, 255, 255, id);
-        expect_names(0, 0, 0, id);
-        for (int category = 0; category < 12; ++category) {
-            expect_names(category, id, 1, 3);
-            for (const int component : {0, 1, 2, 3, 4, 5, 6, 7, 255})
-                expect_names(category, component, id, 3);
+TEST_F(record_names, every_component_and_event_of_every_category) {
+    const std::string commands =
+        "0 start 1 finalize 2 new-packet 3 receive 4 timeout 5 live-report 6 hist-report "
+        "7 user-report ";
+    // Events by component; the last ones are those of all further components.
+    const std::map<std::uint8_t, std::pair<std::string, std::vector<std::string>>> categories{
+        {0,
+         {"0 scheduler 1 function 2 workloop 3 command 4 extfunction 5 timing ",
+          {"0 context-switch 1 prevent-nap 2 thread-state ", "0 function ", "0 action 1 signal ",
+           commands, "0 extfunction ", ""}}},
+        {1, {"0 remoteq 1 endpoint 2 systick 3 interrupt ", {""}}},
+        {2,
+         {"0 accel 1 gyro 2 compass 3 pressure 4 gostin 5 als 6 temperature ",
+          {"0 latency 1 rawdata 2 data 3 filtdata 4 apdata 5 regwrite 6 regread 7 update "
+           "8 filter-state 9 sensor-info 10 annotation 16 trigger-magnitude 17 trigger-latency "}}},
+        {3, {"0 orrin ", {"0 latency 1 monitor 17 trigger-latency "}}},
+        {4, {"0 talvor ", {"0 data-in 1 data-out "}}},
+        {5, {"0 gpio ", {"0 latency "}}},
+        {6,
+         {"0 uart0 1 uart1 2 uart2 ",
+          {"0 preamble 1 sw-handshake 2 hw-handshake 3 trace 4 packet 5 baseband 6 transport "
+           "7 wqr-test "}}},
+        {9, {"0 spi0 1 smb0 2 smb1 3 i2cm0 4 i2c_ctrl0 5 i2c_ctrl1 ", {""}}},
+        {10, {"0 wake ", {"0 wake-req-stats 1 wake-req-info 2 wake-event-info "}}},
+    };
+    for (const std::uint8_t category : byte_list{0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 255}) {
+        const auto row = categories.find(category);
+        const auto& [components, events] =
+            row == categories.end() ? std::pair(std::string(), std::vector{std::string()})
+                                    : row->second;
+        EXPECT_EQ(names("component", &record_ids::component, {category, 0, 1, 3}), components);
+        for (const std::uint8_t component : byte_list{0, 1, 2, 3, 4, 5, 6, 7, 255}) {
+            EXPECT_EQ(names("event", &record_ids::event, {category, component, 0, 3}),
+                      events[std::min<std::size_t>(component, events.size() - 1)])
+                << int{category} << " " << int{component};
         }
     }
+}
+
+TEST(category_decoders, exist_for_all_but_seven_and_name_any_number) {
+    for (std::uint32_t category = 0; category < 300; ++category) {
+        const bool exists = category <= 10 && category != 7;
+        EXPECT_EQ(nrx::decoder_for_category(category) != nullptr, exists) << category;
+    }
+    EXPECT_EQ(nrx::decoder_for_category(2)->component_name(70000).view(), "70000");
+    EXPECT_EQ(nrx::decoder_for_category(0)->event_name(4294967295, 4294967295).view(),
+              "4294967295");
 }
 
 }  // namespace

@@ -2,55 +2,84 @@
 #pragma once
 
 #include <cstdint>
+#include <functional>
 #include <initializer_list>
 #include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "nrxctl/inspection/sensor_info.h"
 #include "tests/support/device_test.h"
 
 namespace tests {
 
-// Numbers of 32 bits, one after the other.
-byte_list words(std::initializer_list<std::int64_t> numbers);
+// Standard output, then standard error.
+inline std::string output_of(const std::function<void()>& operation) {
+    const outcome result = capture(operation);
+    return result.out + result.err;
+}
 
-// Text as it stands, NULs included.
-byte_list bytes_of(std::string_view text);
+// Little-endian 32-bit numbers.
+byte_list numbers(std::initializer_list<std::int64_t> values);
 
-byte_list first_bytes(const byte_list& whole, std::size_t length);
+// The bytes of a text, NULs included.
+inline byte_list bytes_of(std::string_view text) {
+    return {text.begin(), text.end()};
+}
 
-// An entry of the client table; the bytes of its name behind the NUL are not blank.
-byte_list client_entry(std::string_view name, std::initializer_list<std::int64_t> numbers,
-                       std::uint8_t in_use, std::uint8_t option, std::uint8_t power);
+// A prefix in an allocation of its own size, so that a sanitizer finds a read beyond it.
+inline byte_list prefix(const byte_list& bytes, std::size_t length) {
+    return {bytes.begin(), bytes.begin() + static_cast<std::ptrdiff_t>(length)};
+}
 
-// A sensor with the id 31 that answers whatever it may be asked; its events are on entries below
-// it, "first" to "fourth".
-interface_driver& put_whole_sensor(machine& host, std::string_view name);
+// Three entries of a client table. The second one is not in use.
+byte_list client_entries();
 
-// What it prints; a motion sensor has lines of its own.
-std::string whole_text(std::string_view name, std::int32_t level);
-extern const std::string event_line;
+// Adds a sensor with service id 31 that replies to every request. Below it are the entries "first"
+// to "fourth" with its event statistics.
+interface_driver& add_sensor(machine& host, std::string_view name);
 
-// What a check on a reply's length reports.
-std::string too_short(std::size_t needed, std::string_view file = "sensor_reports.cpp");
+// Adds HID interfaces with these names.
+void add_hid_interfaces(machine& host, std::initializer_list<const char*> names);
 
-// What print_sensor_info does.
-outcome inspect(std::string_view name, std::int32_t level);
+// What that sensor prints.
+std::string sensor_text(std::string_view name, std::int32_t level);
 
-// A report of a whole sensor, what it is given (nothing: it is taken away), which part of the text
-// becomes which, and what is reported.
+// Replies of fixed and of variable length, and those that have a structure of their own.
+enum class reply_kind { fixed, variable, structured };
+
+// A report of that sensor, what is printed of it, and what is printed instead if it is missing.
+struct report_row {
+    std::uint32_t id;
+    reply_kind kind;
+    byte_list reply;
+    std::string text;
+    std::string missing_text;
+};
+
+// The reports that the sensor with that name is asked for.
+std::vector<report_row> reports_of(std::string_view name);
+
+inline std::string inspect(std::string_view name, std::int32_t level) {
+    return output_of([&] { nrx::print_sensor_info(name, level); });
+}
+
+// The failure report about a reply shorter than required.
+std::string length_report(std::size_t required, const char* file = source_file::sensor_reports);
+
+// A sensor one of whose reports has another reply, or none: the part of its text that changes, and
+// the failure report.
 struct change {
     std::uint32_t id;
-    std::optional<byte_list> bytes;
+    std::optional<byte_list> reply;
     std::string text;
-    std::string changed;
+    std::string changed_text;
     std::string err = {};
 };
 
-class sensor_test : public device_test {
-protected:
-    // Makes each change to a sensor of its own: the rest of the text stays as it is.
+struct sensor_test : device_test {
+    // Makes each change to a new sensor. The rest of its text must stay the same.
     void expect_changes(std::string_view name, const std::vector<change>& changes);
 };
 

@@ -1,88 +1,95 @@
-// keyprobe as a process, on the embedded device.
+// keyprobe as a process on the embedded device.
 #include "tests/support/program.h"
 
 #include <algorithm>
 #include <cstdlib>
+#include <optional>
 
-#include <gtest/gtest.h>
+#include "keyprobe/options.h"
+#include "tests/golden/golden_text.h"
+#include "tests/support/argument_vector.h"
+#include "tests/support/device_test.h"
+#include "tests/support/rows.h"
 
 namespace {
 
 using namespace tests;
 
 const std::string program = KEYPROBE_PROGRAM;
+const std::string usage = "usage: " + program + " [--collectall]\n";
+const std::string whole_text = golden_text("keyprobe_collectall.txt");
 
-TEST(keyprobe_program, collects_everything_from_the_embedded_device) {
-    const auto result = run_program(program, {"--collectall"});
-    EXPECT_EQ(result.status, 0);
-    EXPECT_EQ(result.err, "");
-    EXPECT_TRUE(result.out.starts_with("==========keyprobe get-stats==============\nkpdx_stats\n"));
-    // Each of the last reports is dumped.
-    EXPECT_NE(result.out.find("hidreport get 0xe4 -u 0xFF00,0x0020===============\n00000000: e4"),
-              std::string::npos);
-    EXPECT_NE(result.out.find("\nLength: 1479, expected 1479\nASSET [Slow][SingleDown]: enable 1"),
-              std::string::npos);
-}
-
-TEST(keyprobe_program, ends_with_the_status_of_its_words) {
-    const std::string usage = "usage: " + program + " [--collectall]\n";
-    const std::string all = run_program(program, {"--collectall"}).out;
-    struct row {
-        std::vector<std::string> words;
-        int status;
-        std::string out;
-        std::string err;
-    };
-    const std::vector<row> rows{
-        {{}, 0, "", ""},
-        {{"word", "-", "--", "--help"}, 0, "", ""},
-        {{"word", "--coll"}, 0, all, ""},
-        {{"--collectall", "word", "--c"}, 0, all + all, ""},
-        {{"--help"}, 1, "", usage},
-        {{"--h"}, 1, "", usage},
-        {{"-b", "--collectall"}, 1, "", usage},
-        {{"-fx"}, 1, "", usage},
-        {{"-f", "file"}, 1, "", usage},
-        {{"-f"}, 1, "", program + ": option requires an argument -- 'f'\n" + usage},
-        {{"-s"}, 1, "", program + ": invalid option -- 's'\n" + usage},
-        {{"--nope"}, 1, "", program + ": unrecognized option '--nope'\n" + usage},
-        {{"--collectall=x"},
-         1,
-         "",
+TEST(keyprobe_program, ends_with_the_output_and_status_of_its_arguments) {
+    ASSERT_NE(whole_text, "");
+    const rows<std::string, int, std::string, std::string> cases{
+        {"", 0, "", ""},
+        {"word - -- --help", 0, "", ""},
+        {"--collectall", 0, whole_text, ""},
+        {"word --coll", 0, whole_text, ""},
+        {"--collectall word --c", 0, whole_text + whole_text, ""},
+        {"--help", 1, "", usage},
+        {"-b --collectall", 1, "", usage},
+        {"-f file", 1, "", usage},
+        {"-f", 1, "", program + ": option requires an argument -- 'f'\n" + usage},
+        {"-s", 1, "", program + ": invalid option -- 's'\n" + usage},
+        {"--nope", 1, "", program + ": unrecognized option '--nope'\n" + usage},
+        {"--collectall=x", 1, "",
          program + ": option '--collectall' doesn't allow an argument\n" + usage},
-        {{"--collectall", "-b"}, 1, all, usage},
+        {"--collectall -b", 1, whole_text, usage},
     };
-    for (const row& one : rows) {
-        const auto result = run_program(program, one.words);
-        EXPECT_EQ(result.status, one.status) << ::testing::PrintToString(one.words);
-        EXPECT_EQ(result.out, one.out) << ::testing::PrintToString(one.words);
-        EXPECT_EQ(result.err, one.err) << ::testing::PrintToString(one.words);
+    for (const bool posix_rules : {false, true}) {
+        if (posix_rules) ::setenv("POSIXLY_CORRECT", "1", 1);
+        for (const auto& [arguments, status, out, err] : cases) {
+            const auto result = run_program(program, split(arguments));
+            EXPECT_EQ(result.status, status) << arguments;
+            EXPECT_EQ(result.out, out) << arguments;
+            EXPECT_EQ(result.err, err) << arguments;
+        }
     }
-}
-
-TEST(keyprobe_program, parses_the_same_whatever_the_environment) {
-    ::setenv("POSIXLY_CORRECT", "1", 1);
-    const auto result = run_program(program, {"word", "--collectall"});
     ::unsetenv("POSIXLY_CORRECT");
-    EXPECT_TRUE(result.out.starts_with("==========keyprobe get-stats==============\n"));
 }
 
-TEST(keyprobe_program, survives_output_that_cannot_be_written) {
-    for (const output_to target :
-         {output_to::closed_pipe, output_to::full_device, output_to::nowhere}) {
+TEST(keyprobe_program, ignores_output_that_cannot_be_written) {
+    for (const output_target target :
+         {output_target::closed_pipe, output_target::full_device, output_target::closed}) {
         const auto result = run_program(program, {"--collectall"}, target);
         EXPECT_EQ(result.status, 0);
         EXPECT_EQ(result.err, "");
     }
 }
 
-TEST(keyprobe_program, writes_whole_lines_one_at_a_time) {
-    const auto writes = writes_of(program, {"--collectall"});
+TEST(keyprobe_program, writes_one_line_at_a_time) {
+    const auto writes = record_writes(program, {"--collectall"});
     EXPECT_GT(writes.size(), 100U);
     for (const std::string& text : writes) {
         EXPECT_EQ(std::count(text.begin(), text.end(), '\n'), 1) << text;
         EXPECT_TRUE(text.ends_with('\n')) << text;
     }
+}
+
+// Runs the front end in this process. The status is that of a return from main or of the end of the
+// process.
+outcome run(std::vector<std::string> arguments) {
+    argument_vector command_line(std::move(arguments));
+    std::optional<int> returned;
+    auto result =
+        capture([&] { returned = nrx::keyprobe::run(command_line.argc(), command_line.argv()); });
+    if (!result.status) result.status = returned;
+    return result;
+}
+
+TEST(keyprobe_options, fail_without_a_program_name_but_not_with_the_collection) {
+    machine empty_host;
+    const platform::simulated::installed_machine installed(empty_host);
+    // The next run resets the parser, which this one leaves inside an argument.
+    EXPECT_EQ(run({"keyprobe", "-bb"}).status, 1);
+    const auto result = run({"keyprobe", "--collectall"});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.out, "==========keyprobe arc 0xd0==============\n");
+    EXPECT_TRUE(result.err.ends_with(failure_line("keyprobe", "service", source_file::collection)));
+    const auto nameless = run({});
+    EXPECT_EQ(nameless.status, 1);
+    EXPECT_EQ(nameless.err, "usage: keyprobe [--collectall]\n");
 }
 
 }  // namespace

@@ -1,3 +1,5 @@
+// The contract of the registry, and of entries that are removed.
+
 #include "platform/registry.h"
 
 #include <memory>
@@ -6,148 +8,148 @@
 
 namespace tests {
 
-namespace {
+using namespace platform;
 
-using platform::array;
-using platform::dictionary;
-using platform::first_child;
-using platform::matching_class;
-using platform::property;
-using platform::service;
+namespace {
 
 dictionary usage(std::int32_t page, std::int32_t code) {
     return {{"DeviceUsagePage", page}, {"DeviceUsage", code}};
 }
 
-dictionary with_usage(std::int32_t page, std::int32_t code) {
-    return {{"DeviceUsagePairs", array{usage(page, code)}}};
+dictionary with_usages(const property& pairs) {
+    return {{"DeviceUsagePairs", pairs}};
 }
 
-dictionary usage_and_class(std::string_view class_name) {
-    dictionary both = with_usage(1, 2);
-    both.set("IOProviderClass", class_name);
-    return both;
-}
-
-dictionary with(const property& properties) {
+dictionary with_properties(const property& properties) {
     return {{"IOPropertyMatch", properties}};
 }
 
-// Two interface services, the second with a HID device below it.
-class registry : public device_test {
+// Two interface services, the second of which has a HID device as its child.
+class registry_entries : public device_test {
 protected:
-    registry() {
-        put("accel", 7);
+    registry_entries() {
+        add("accel", 7);
         host.add({.name = "gyro-hid",
                   .classes = {"hid", "base"},
                   .properties = {{"LocationID", std::int64_t{8}},
                                  {"DeviceUsagePairs", array{usage(0x20, 0x76), usage(1, 2)}}},
-                  .hid = std::make_shared<platform::simulated::hid_unit>()},
-                 put("gyro", 8));
+                  .hid = std::make_shared<simulated::virtual_hid_device>()},
+                 add("gyro", 8));
     }
 
-    platform::simulated::entry_ref put(const char* name, std::int32_t id) {
+    simulated::entry_ref add(const char* name, std::int32_t id) {
         return host.add({.name = name,
                          .classes = {"interface", "base"},
                          .properties = {{"service_id", id}, {"rate", 100}},
-                         .unit = std::make_shared<interface_driver>()});
+                         .driver = std::make_shared<interface_driver>()});
     }
 
-    static std::string matched(const dictionary& matching) {
-        return name_of(platform::first_match(matching));
-    }
     static std::string name_of(const service& entry) {
-        std::string name;
-        return platform::entry_name(entry, name) == platform::success ? name : "none";
+        std::string name = "none";
+        entry_name(entry, name);
+        return name;
     }
 };
 
-TEST_F(registry, the_first_match_in_registration_order_comes_back_and_names_have_127_characters) {
-    EXPECT_EQ(matched({}), "accel");
-    EXPECT_EQ(matched(with(dictionary{{"rate", 100}})), "accel");
-    host.remove("accel");
-    EXPECT_EQ(matched({}), "gyro");
-    EXPECT_EQ(matched(matching_class("base")), "gyro");
-    host.add({.name = std::string(127, 'x') + "yz", .classes = {"long"}});
-    EXPECT_EQ(matched(matching_class("long")), std::string(127, 'x'));
-}
-
-TEST_F(registry, an_entry_matches_if_every_key_holds) {
-    const std::vector<std::pair<dictionary, std::string>> rows{
-        // class, or a base of it
+TEST_F(registry_entries, match_by_every_key) {
+    const std::vector<std::pair<dictionary, std::string>> cases{
+        {dictionary{}, "accel"},
+        // Class or base class.
         {matching_class("interface"), "accel"},
-        {matching_class("hid"), "gyro-hid"},
         {matching_class("base"), "accel"},
         {matching_class("Interface"), "none"},
         {{{"IOProviderClass", 1}}, "none"},
-        // whole name
+        // Whole name.
         {{{"IONameMatch", "gyro"}}, "gyro"},
         {{{"IONameMatch", "gyr"}}, "none"},
         {{{"IONameMatch", 8}}, "none"},
-        // all properties
-        {with(dictionary{{"service_id", std::int64_t{8}}}), "gyro"},
-        {with(dictionary{{"rate", 100}, {"service_id", 8}}), "gyro"},
-        {with(dictionary{{"rate", 99}, {"service_id", 8}}), "none"},
-        {with(dictionary{{"absent", 8}}), "none"},
-        {with(8), "none"},
-        // location, and any usage in common
+        // All properties.
+        {with_properties(dictionary{{"rate", 100}}), "accel"},
+        {with_properties(dictionary{{"service_id", std::int64_t{8}}}), "gyro"},
+        {with_properties(dictionary{{"rate", 100}, {"service_id", 8}}), "gyro"},
+        {with_properties(dictionary{{"rate", 99}, {"service_id", 8}}), "none"},
+        {with_properties(dictionary{{"absent", 8}}), "none"},
+        {with_properties(8), "none"},
+        // Location, and any common usage pair.
         {{{"LocationID", 8}}, "gyro-hid"},
         {{{"LocationID", 7}}, "none"},
-        {with_usage(0x20, 0x76), "gyro-hid"},
-        {with_usage(1, 2), "gyro-hid"},
-        {with_usage(0x20, 2), "none"},
-        {{{"DeviceUsagePairs", array{usage(9, 9), usage(1, 2)}}}, "gyro-hid"},
-        {{{"DeviceUsagePairs", array{}}}, "none"},
-        {{{"DeviceUsagePairs", usage(1, 2)}}, "none"},
-        // more than one key, and unknown ones
-        {usage_and_class("hid"), "gyro-hid"},
-        {usage_and_class("interface"), "none"},
+        {with_usages(array{usage(0x20, 0x76)}), "gyro-hid"},
+        {with_usages(array{usage(1, 2)}), "gyro-hid"},
+        {with_usages(array{usage(0x20, 2)}), "none"},
+        {with_usages(array{usage(9, 9), usage(1, 2)}), "gyro-hid"},
+        {with_usages(array{}), "none"},
+        {with_usages(usage(1, 2)), "none"},
+        // Several keys, and unknown keys.
+        {{{"IOProviderClass", "hid"}, {"LocationID", 8}}, "gyro-hid"},
+        {{{"IOProviderClass", "interface"}, {"LocationID", 8}}, "none"},
         {{{"service_id", 7}}, "none"},
         {{{"IONameMatch", "gyro"}, {"Anything", 1}}, "none"},
     };
-    for (const auto& [matching, name] : rows)
-        EXPECT_EQ(matched(matching), name) << platform::describe(matching);
+    for (const auto& [matching, name] : cases)
+        EXPECT_EQ(name_of(first_match(matching)), name) << describe(matching);
 }
 
-TEST_F(registry, the_first_child_that_is_there_comes_back_in_the_service_plane_only) {
-    const auto gyro = host.find("gyro");
-    host.add({.name = "second", .hid = gyro->children.front()->hid}, gyro);
+TEST_F(registry_entries, are_all_found_unless_the_look_up_fails) {
+    std::vector<service> services(1);
+    host.fail_call(1, failure::io);
+    EXPECT_EQ(all_matches(matching_class("base"), services), simulated::io_failure);
+    EXPECT_EQ(services.size(), 1U);
+    EXPECT_EQ(all_matches(matching_class("base"), services), success);
+    ASSERT_EQ(services.size(), 3U);
+    EXPECT_EQ(name_of(services[0]) + name_of(services[1]) + name_of(services[2]),
+              "accelgyrogyro-hid");
+    host.add({.name = std::string(127, 'x') + "yz", .classes = {"long"}});
+    EXPECT_EQ(all_matches(matching_class("long"), services), success);
+    EXPECT_EQ(name_of(services.at(0)), std::string(127, 'x')) << "names are cut";
+    EXPECT_EQ(all_matches(matching_class("absent"), services), success);
+    EXPECT_TRUE(services.empty());
+}
+
+TEST_F(registry_entries, have_children_in_the_service_plane) {
+    host.add({.name = "second"}, host.find("gyro"));
     const service parent = service_named("gyro");
     EXPECT_EQ(name_of(first_child(parent, "IOService")), "gyro-hid");
     EXPECT_FALSE(first_child(parent, "IOPower"));
-    EXPECT_FALSE(first_child(first_child(parent, "IOService"), "IOService"));
+    EXPECT_FALSE(first_child(service_named("second"), "IOService"));
+    EXPECT_FALSE(first_child(service(), "IOService"));
     host.remove("gyro-hid");
     EXPECT_EQ(name_of(first_child(parent, "IOService")), "second");
-    host.remove("gyro");
-    EXPECT_FALSE(first_child(parent, "IOService"));
-    EXPECT_FALSE(first_child(service(), "IOService"));
 }
 
-TEST_F(registry, a_property_comes_back_as_a_copy) {
+TEST_F(registry_entries, copy_properties_and_need_a_driver_to_set_them) {
     const service gyro = service_named("gyro");
     const auto before = read_property(gyro, "rate");
-    EXPECT_EQ(set_property(gyro, "rate", 50), platform::success);
-    EXPECT_EQ(set_property(gyro, "new", "text"), platform::success);
+    EXPECT_EQ(set_property(gyro, "rate", 50), success);
+    EXPECT_EQ(set_property(gyro, "new", "text"), success);
     EXPECT_EQ(before->number(), 100);
     EXPECT_EQ(read_property(gyro, "rate")->number(), 50);
     EXPECT_EQ(*read_property(gyro, "new")->text(), "text");
     EXPECT_EQ(read_property(gyro, "absent"), std::nullopt);
-    // An entry without a driver takes none.
-    host.add({.name = "bare", .properties = {{"rate", 1}}});
-    const service bare = service_named("bare");
-    EXPECT_EQ(set_property(bare, "rate", 2), platform::unsupported);
+    property value("unchanged");
+    EXPECT_FALSE(read_property(gyro, "absent", value));
+    EXPECT_EQ(*value.text(), "unchanged");
+    host.add({.name = "bare"});
+    EXPECT_EQ(set_property(service_named("bare"), "rate", 2), unsupported);
 }
 
-TEST_F(registry, an_entry_that_is_gone_has_no_name_and_no_properties) {
+TEST_F(registry_entries, are_removed_with_everything_attached) {
     const service gyro = service_named("gyro");
-    const service none;
+    host.add({.name = "grandchild"}, host.find("gyro-hid"));
+    host.add({.name = "gyro"});
+    host.remove("absent");
     host.remove("gyro");
+    EXPECT_EQ(host.find("gyro-hid"), nullptr);
+    EXPECT_EQ(host.find("grandchild"), nullptr);
+    EXPECT_FALSE(service_named("grandchild"));
+    EXPECT_EQ(host.find("gyro"), host.entries().back());
+    const service none;
     for (const service* entry : {&gyro, &none}) {
-        std::string name = "untouched";
-        EXPECT_EQ(entry_name(*entry, name), platform::not_found);
-        EXPECT_EQ(name, "untouched");
+        EXPECT_EQ(name_of(*entry), "none");
+        EXPECT_FALSE(first_child(*entry, "IOService"));
         EXPECT_EQ(read_property(*entry, "rate"), std::nullopt);
-        EXPECT_EQ(set_property(*entry, "rate", 1), platform::not_found);
+        EXPECT_EQ(set_property(*entry, "rate", 1), not_found);
+        std::string name;
+        EXPECT_EQ(entry_name(*entry, name), not_found);
     }
 }
 

@@ -1,155 +1,221 @@
-// What a backend promises about the event loop.
+// The contract of clocks, interrupts and the event loop.
 
 #include "platform/run_loop.h"
 
 #include <csignal>
-#include <ctime>
-#include <thread>
+#include <functional>
 
 #include "platform/clock.h"
 #include "platform/hid_plugin.h"
 #include "platform/interrupt.h"
+#include "platform/virtual/interrupts.h"
 #include "platform/virtual/return_codes.h"
+#include "tests/platform/platform_test.h"
 #include "tests/support/hid_host.h"
 
 namespace tests {
 
+using namespace platform;
+using namespace std::chrono_literals;
+
 namespace {
 
-using namespace std::chrono_literals;
-using platform::run_loop;
-using platform::run_loop_for;
-using platform::stop_loop;
-using platform::simulated::endless_wait;
+int handled = 0;
+std::function<void()> on_handle;
 
-// One callback: the first byte of the record, and the time.
-using seen = std::vector<std::pair<int, clock_time>>;
+void count_interrupt() {
+    ++handled;
+    if (on_handle) on_handle();
+}
 
-class event_loop : public device_test {
-public:
-    event_loop() = default;
-    ~event_loop() override { platform::restore_default_interrupt(); }
-    event_loop(const event_loop&) = delete;
-    event_loop& operator=(const event_loop&) = delete;
+bool has_default_action() {
+    struct sigaction current {};
+    ::sigaction(SIGINT, nullptr, &current);
+    return current.sa_handler == SIG_DFL;
+}
 
+}  // namespace
+
+class interrupts : public queue_test {
 protected:
-    platform::hid_interface listen(const char* name) {
+    void SetUp() override {
+        handled = 0;
+        on_handle = nullptr;
+        set_interrupt_handler(count_interrupt);
+    }
+    void TearDown() override {
+        restore_default_interrupt();
+        EXPECT_TRUE(has_default_action());
+    }
+};
+
+TEST_F(interrupts, are_handled_once_when_a_platform_call_returns) {
+    std::raise(SIGINT);
+    std::raise(SIGINT);
+    EXPECT_EQ(handled, 0);
+    service_named("nobody");
+    EXPECT_EQ(handled, 1);
+    service_named("nobody");
+    EXPECT_EQ(handled, 1);
+}
+
+TEST_F(interrupts, inside_their_handler_are_handled_afterwards) {
+    on_handle = [] {
+        if (handled > 1) return;
+        std::raise(SIGINT);
+        service_named("nobody");
+        EXPECT_EQ(handled, 1);
+    };
+    std::raise(SIGINT);
+    service_named("nobody");
+    EXPECT_EQ(handled, 2);
+}
+
+TEST_F(interrupts, pending_are_handled_before_the_default_is_restored) {
+    std::raise(SIGINT);
+    restore_default_interrupt();
+    EXPECT_EQ(handled, 1);
+    EXPECT_TRUE(has_default_action());
+}
+
+TEST_F(interrupts, pending_prevent_blocking) {
+    std::raise(SIGINT);
+    simulated::await_interrupt(std::nullopt);
+    EXPECT_EQ(handled, 0);
+    sigset_t blocked{};
+    ::pthread_sigmask(SIG_SETMASK, nullptr, &blocked);
+    EXPECT_FALSE(::sigismember(&blocked, SIGINT));
+}
+
+TEST_F(interrupts, during_a_sleep_are_handled_at_once) {
+    on_handle = [&] { EXPECT_EQ(host.clock().now(), 30ms); };
+    host.clock().run_at(30ms, [] { std::raise(SIGINT); });
+    sleep(100ms);
+    EXPECT_EQ(handled, 1);
+    EXPECT_EQ(host.clock().now(), 100ms);
+}
+
+TEST_F(interrupts, before_a_wait_are_not_missed) {
+    shared_queue& shared = connect_streamer();
+    host.clock().follow_host();
+    on_handle = [&] { shared.add({1}); };
+    host.before_call(1, [] { std::raise(SIGINT); });
+    EXPECT_EQ(wait_for_data(queue, port), success);
+    EXPECT_EQ(handled, 1);
+}
+
+using host_clocks = device_test;
+
+TEST_F(host_clocks, read_the_same_instant_and_sleep_the_whole_duration) {
+    host.clock().set_wall_start(1'700'000'000'250'000us);
+    sleep(1'500'000us);
+    const auto reading = read_clocks();
+    EXPECT_EQ(reading.ticks, ticks());
+    EXPECT_EQ(reading.wall.seconds, 1'700'000'001);
+    EXPECT_EQ(reading.wall.microseconds, 750'000);
+    host.clock().follow_host();
+    const auto wall_before = std::chrono::system_clock::now().time_since_epoch();
+    EXPECT_NEAR(static_cast<double>(read_clocks().wall.seconds),
+                std::chrono::duration<double>(wall_before).count(), 10);
+    const auto steady_before = std::chrono::steady_clock::now();
+    const auto ticks_before = ticks();
+    sleep(20ms);
+    EXPECT_GE(std::chrono::steady_clock::now() - steady_before, 20ms);
+    EXPECT_GE(static_cast<double>(ticks() - ticks_before) * tick_period(), 0.0199);
+}
+
+// Callbacks: the first byte of the record, and the time.
+using callbacks = std::vector<std::pair<int, clock_time>>;
+
+class event_loops : public device_test {
+protected:
+    void TearDown() override { restore_default_interrupt(); }
+
+    hid_interface listen(const char* name) {
         auto device = query_hid_interface(create_hid_plugin(service_named(name)));
-        const auto note = [this](platform::byte_view record) {
-            called.emplace_back(record[0], host.clock().now());
+        const auto on_record = [this](byte_view record) {
+            made.emplace_back(record[0], host.clock().now());
             if (on_call) on_call(record[0]);
         };
-        EXPECT_EQ(schedule_on_loop(device), platform::success);
-        EXPECT_EQ(set_record_callback(device, note), platform::success);
-        EXPECT_EQ(set_mode(device, 0, 1), platform::success);
+        EXPECT_EQ(schedule_on_loop(device), success);
+        EXPECT_EQ(set_record_callback(device, on_record), success);
+        EXPECT_EQ(set_mode(device, 0, 1), success);
         return device;
     }
 
-    // Runs to the end that stop_loop brings about, and tells what was called back.
-    seen stopped_run() {
-        called.clear();
-        EXPECT_EQ(run_loop(), platform::success);
-        return called;
+    // Runs the loop, until it is stopped or for a duration, and returns the callbacks made.
+    callbacks run(return_code expected = success) {
+        made.clear();
+        EXPECT_EQ(run_loop(), expected);
+        return made;
     }
-    seen run_for(std::chrono::microseconds duration) {
-        called.clear();
-        EXPECT_EQ(run_loop_for(duration), platform::success);
-        return called;
+    callbacks run_for(std::chrono::microseconds duration) {
+        made.clear();
+        EXPECT_EQ(run_loop_for(duration), success);
+        return made;
     }
 
-    seen called;
+    callbacks made;
     std::function<void(int)> on_call;
-    scripted_records& first_records = put_hid_device(host, "first", 1);
-    scripted_records& second_records = put_hid_device(host, "second", 2);
-    platform::hid_interface first = listen("first");
-    platform::hid_interface second = listen("second");
+    scripted_records& first_records = add_hid_device(host, "first", 1);
+    scripted_records& second_records = add_hid_device(host, "second", 2);
+    hid_interface first = listen("first");
+    hid_interface second = listen("second");
 };
 
-TEST_F(event_loop, calls_back_in_the_order_of_the_times_up_to_the_end_of_the_run) {
+TEST_F(event_loops, call_back_in_the_order_of_due_times) {
     first_records.script = {{10ms, {1}}, {30ms, {3}}, {40ms, {4}}, {1s + 1ns, {6}}};
     second_records.script = {{20ms, {2}}, {40ms, {5}}};
-    EXPECT_EQ(run_for(40ms), (seen{{1, 10ms}, {2, 20ms}, {3, 30ms}, {4, 40ms}, {5, 40ms}}));
-    EXPECT_EQ(run_for(960ms), seen());
+    EXPECT_EQ(run_for(40ms), (callbacks{{1, 10ms}, {2, 20ms}, {3, 30ms}, {4, 40ms}, {5, 40ms}}));
+    EXPECT_EQ(run_for(960ms), callbacks());
     EXPECT_EQ(host.clock().now(), 1s);
     EXPECT_EQ(run_for(1ms).size(), 1U);
 }
 
-TEST_F(event_loop, stops_inside_a_callback_before_the_next_one) {
+TEST_F(event_loops, stop_one_run_before_the_next_callback) {
     first_records.script = {{10ms, {1}}, {10ms, {2}}, {30ms, {3}}};
     on_call = [](int record) {
         if (record != 2) stop_loop();
     };
-    EXPECT_EQ(stopped_run(), (seen{{1, 10ms}}));
-    EXPECT_EQ(stopped_run(), (seen{{2, 10ms}, {3, 30ms}}));
-}
-
-TEST_F(event_loop, a_stop_before_a_run_ends_that_run_alone) {
-    first_records.script = {{0ms, {1}}};
     stop_loop();
     stop_loop();
-    EXPECT_EQ(stopped_run(), seen());
-    EXPECT_EQ(run_for(5ms), (seen{{1, 0ms}}));
+    EXPECT_EQ(run(), callbacks());
+    EXPECT_EQ(run(), (callbacks{{1, 10ms}}));
+    EXPECT_EQ(run(), (callbacks{{2, 10ms}, {3, 30ms}}));
 }
 
-TEST_F(event_loop, late_callbacks_are_made_but_do_not_draw_a_run_out) {
+TEST_F(event_loops, are_not_prolonged_by_late_callbacks) {
     first_records.script = {{10ms, {1}}, {20ms, {2}}, {40ms, {3}}};
-    on_call = [](int) { platform::sleep(100ms); };
-    EXPECT_EQ(run_for(30ms), (seen{{1, 10ms}, {2, 110ms}}));
+    on_call = [](int) { sleep(100ms); };
+    EXPECT_EQ(run_for(30ms), (callbacks{{1, 10ms}, {2, 110ms}}));
 }
 
-TEST_F(event_loop, a_run_that_nothing_can_end_fails) {
-    EXPECT_EQ(run_loop(), endless_wait);
+TEST_F(event_loops, fail_if_nothing_can_end_the_run) {
+    EXPECT_EQ(run(simulated::deadlock), callbacks());
     first_records.script = {{10ms, {1}}, {20ms, {2}}};
     second_records.script = {{15ms, {3}}};
-    host.clock().plan(12ms, [&] { host.remove("first"); });
-    EXPECT_EQ(run_loop(), endless_wait);
-    EXPECT_EQ(called, (seen{{1, 10ms}, {3, 15ms}}));
+    host.clock().run_at(12ms, [&] { host.remove("first"); });
+    EXPECT_EQ(run(simulated::deadlock), (callbacks{{1, 10ms}, {3, 15ms}}));
 }
 
-TEST_F(event_loop, what_is_released_calls_back_no_more_not_even_from_its_own_callback) {
+TEST_F(event_loops, do_not_call_back_a_released_source) {
     first_records.script = {{10ms, {1}}, {20ms, {2}}};
     on_call = [&](int) { first.reset(); };
-    EXPECT_EQ(run_for(1s), (seen{{1, 10ms}}));
+    EXPECT_EQ(run_for(1s), (callbacks{{1, 10ms}}));
 }
 
-TEST_F(event_loop, an_interrupt_stops_it_at_once_whenever_it_comes) {
-    platform::handle_interrupt(stop_loop);
+TEST_F(event_loops, are_stopped_by_an_interrupt_at_any_time) {
+    set_interrupt_handler(stop_loop);
     first_records.script = {{10ms, {1}}, {20ms, {2}}, {50ms, {3}}};
     on_call = [](int record) {
         if (record == 1) std::raise(SIGINT);
     };
-    EXPECT_EQ(stopped_run(), (seen{{1, 10ms}}));
-    host.clock().plan(40ms, [] { std::raise(SIGINT); });
-    EXPECT_EQ(stopped_run(), (seen{{2, 20ms}}));
+    EXPECT_EQ(run(), (callbacks{{1, 10ms}}));
+    host.clock().run_at(40ms, [] { std::raise(SIGINT); });
+    EXPECT_EQ(run(), (callbacks{{2, 20ms}}));
     EXPECT_EQ(host.clock().now(), 40ms);
     std::raise(SIGINT);
-    EXPECT_EQ(stopped_run(), seen());
+    EXPECT_EQ(run(), callbacks());
 }
-
-// Another thread sends it while this one is blocked.
-TEST_F(event_loop, a_blocked_run_uses_no_processor_time_and_wakes_for_an_interrupt) {
-    host.clock().follow_host();
-    platform::handle_interrupt(stop_loop);
-    std::thread sender([self = ::pthread_self()] {
-        std::this_thread::sleep_for(100ms);
-        ::pthread_kill(self, SIGINT);
-    });
-    const std::clock_t before = std::clock();
-    EXPECT_EQ(stopped_run(), seen());
-    EXPECT_LT(std::clock() - before, CLOCKS_PER_SEC / 20);
-    sender.join();
-}
-
-TEST_F(event_loop, waits_for_the_times_when_it_follows_the_host) {
-    host.clock().follow_host();
-    const auto start = host.clock().now();
-    first_records.script = {{start + 20ms, {1}}, {start + 1h, {2}}};
-    on_call = [](int) { stop_loop(); };
-    ASSERT_EQ(run_for(10s).size(), 1U);
-    EXPECT_GE(called[0].second - start, 20ms);
-    EXPECT_LT(called[0].second - start, 5s);
-}
-
-}  // namespace
 
 }  // namespace tests

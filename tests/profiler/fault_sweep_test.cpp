@@ -1,92 +1,58 @@
 // Every operation of the profiler family survives the failure of any platform call.
-
 #include "tests/support/fault_sweep.h"
 
-#include "nrxctl/base/tick_period.h"
+#include <regex>
+
+#include "nrxctl/base/clock_references.h"
 #include "nrxctl/profiler/profile_command.h"
 #include "nrxctl/profiler/scm_monitor.h"
 #include "platform/clock.h"
 #include "platform/virtual/profiler/profiler.h"
+#include "tests/support/argument_vector.h"
 #include "tests/support/device_test.h"
-#include "tests/support/word_vector.h"
+#include "tests/support/rows.h"
 
 namespace tests {
 
-namespace {
-
 std::unique_ptr<machine> make_host() {
     auto host = std::make_unique<machine>();
-    serve_profile(put_service(*host, "profile", 1), add_profiler_driver(*host));
+    serve_profile(add_service(*host, "profile", 1), add_profiler_driver(*host));
     return host;
 }
 
-using family_command = void (*)(std::string_view, std::span<char* const>, int&);
-
-// Sweeps a command with its first argument and its further words.
-void sweep(family_command command, const std::string& words,
-           const std::function<bool(const fault&)>& acceptable) {
-    const word_vector all(split(words));
-    const auto operation = [&] {
-        int index = 1;
-        command(all.all()[0], all.all(), index);
-    };
-    sweep_faults(make_host, operation, acceptable);
-}
-
-// Look-ups that only probe for a half of the profiler say nothing when they fail, nor do those of a
-// record's times; a sleep cannot be missed.
-bool is_a_probe(const fault& one) {
-    for (const char* probe : {"IONameMatch = \"WQR_", "IONameMatch = \"profile\"", "sleep ",
-                              "data available ", "KeltoNRXTimesync", "boot time"}) {
-        if (one.name.find(probe) != std::string::npos) return true;
-    }
-    return false;
-}
-
-// An unsupported configuration is announced instead.
-bool is_announced(const fault& one) {
-    return one.result.out.find("config: At least one config failed") != std::string::npos ||
-           one.result.out.find("Can't enable SCM profiler") != std::string::npos;
-}
-
-bool is_reported_or_foreseen(const fault& one) {
-    return !one.result.err.empty() || one.how == failure::nothing || is_a_probe(one) ||
-           is_announced(one);
-}
-
-// "get-config" shows what it cannot read as nothing active.
-bool is_reported_or_shown_as_none(const fault& one) {
-    return is_reported_or_foreseen(one) || one.result.out.find("    none\n") != std::string::npos;
-}
-
-// "signal-errdump" and the driver's log are silent without a driver.
-bool is_reported_or_without_driver(const fault& one) {
-    return is_reported_or_foreseen(one) ||
-           one.name.find("IONameMatch = \"KeltoNRXProfileDriver\"") != std::string::npos;
-}
-
-}  // namespace
-
-TEST(profiler_fault_sweep, subcommands_report_every_failure_that_is_no_probe) {
-    for (const char* words : {"clear-eventsources", "eventsources", "wqrfw-wakestats", "enable",
-                              "disable", "on-error panic"}) {
-        // The first of the two look-ups of a service by name may find nothing.
-        sweep(nrx::profile_command, words, [](const fault& one) {
-            return !one.result.err.empty() || one.how == failure::nothing || one.call == 1;
-        });
-    }
-    for (const char* words : {"stop", "flush", "config sensor:accel"})
-        sweep(nrx::profile_command, words, is_reported_or_foreseen);
-    sweep(nrx::profile_command, "get-config", is_reported_or_shown_as_none);
-    for (const char* words : {"signal-errdump", "get-logs errdump fwdump", "get-logs human"})
-        sweep(nrx::profile_command, words, is_reported_or_without_driver);
-}
-
-TEST(profiler_fault_sweep, monitors_report_end_and_leave_nothing_open) {
+TEST(profiler_fault_sweep, failed_call_is_reported_and_leaves_nothing_open) {
     nrx::tick_period = platform::tick_period();
-    for (const char* words : {"40 sensor:accel", "monitor human 40"})
-        sweep(nrx::profile_command, words, is_reported_or_foreseen);
-    sweep(nrx::scm_monitor, "40 scm:spi0:ch0", is_reported_or_foreseen);
+    // Calls that may fail without a report, as the log has them.
+    const std::string prefixed_lookup = "IONameMatch = \"WQR_";
+    const std::string lookups = "IONameMatch = \"(WQR_|profile\")";
+    const std::string driver_lookup = lookups + "|IONameMatch = \"KeltoNRXProfileDriver\"";
+    const std::string waits = lookups + "|sleep |data available ";
+    const std::string record_times = "|KeltoNRXTimesync|boot time";
+    // What is printed instead of a report.
+    const std::regex refusals("config: At least one config failed|Can't enable SCM profiler");
+    for (const auto& [command_lines, silent_calls] : rows<std::string, std::string>{
+             {"enable;disable", "none"},
+             {"clear-eventsources;eventsources;wqrfw-wakestats;on-error panic", prefixed_lookup},
+             {"stop;flush;config sensor:accel", lookups},
+             {"get-config", lookups + "|KeltoNRXProfileDriver 3|open profile|call profile"},
+             {"signal-errdump;get-logs errdump fwdump", driver_lookup},
+             {"get-logs human", driver_lookup + record_times},
+             {"40 sensor:accel;40 scm:spi0:ch0", waits},
+             {"monitor human 40", waits + record_times}}) {
+        for (const std::string& command_line : split(command_lines, ';')) {
+            const argument_vector all(split(command_line));
+            const bool is_scm = command_line.find("scm:") != std::string::npos;
+            const auto operation = [&] {
+                int index = 1;
+                (is_scm ? nrx::scm_monitor : nrx::profile_command)(all.all()[0], all.all(), index);
+            };
+            sweep_faults(make_host, operation, [&, silent = std::regex(silent_calls)](auto& fault) {
+                return !fault.result.err.empty() || fault.kind == failure::empty_result ||
+                       std::regex_search(fault.name, silent) ||
+                       std::regex_search(fault.result.out, refusals);
+            });
+        }
+    }
 }
 
 }  // namespace tests

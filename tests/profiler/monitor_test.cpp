@@ -1,218 +1,235 @@
+// The monitors of records and of SCM transfers.
 #include "nrxctl/profiler/monitor.h"
 
 #include <csignal>
-#include <tuple>
 
-#include "nrxctl/decoders/profile_hexdump.h"
-#include "nrxctl/profiler/interrupt_stop.h"
+#include "nrxctl/decoders/record_text.h"
+#include "nrxctl/profiler/kernel_profiler.h"
+#include "nrxctl/profiler/scm_monitor.h"
 #include "tests/profiler/profiler_host.h"
-#include "tests/support/word_vector.h"
+#include "tests/support/argument_vector.h"
 
 namespace tests {
 
 using namespace std::chrono_literals;
 
-namespace {
-
-const byte_list marker = record_bytes(0, 0);
-
-// Whether the stream came to its end, and what was written.
-using run = std::tuple<bool, std::string, std::string>;
-
-// A run to the end: the records, then the coprocessor's log.
-run ended(const std::string& records, const std::string& reports = "") {
-    return {true, records + dumped(8, 0x77) + "done\n", reports};
+// A complete run: the records, the coprocessor's log, and failure reports.
+result complete(const std::string& records, const std::string& reports = "") {
+    return {true, records + dumped(8, 0x77) + "done\n" + reports};
 }
 
-}  // namespace
+struct monitor : profiler_test {
+    // Adds an entry to the queue at a time from now.
+    void add_in(std::chrono::milliseconds delay, const byte_list& entry) {
+        host.clock().run_at(host.clock().now() + delay, [=, this] { driver->queue->add(entry); });
+    }
 
-class monitor : public profiler_test {
-protected:
-    void SetUp() override {
-        profiler_test::SetUp();
-        put_both_halves();
-        service->set_report_source(0xd1, [this](std::size_t, byte_list& reply) {
-            if (!std::exchange(log_read_, true)) reply = record_bytes(8, 0x77);
-            return platform::success;
+    // Runs a monitor. The coprocessor's log holds one record.
+    result watch(std::uint32_t duration = 0) {
+        set_fw_log(record_bytes(8, 0x77));
+        return attempt([=] {
+            const nrx::scoped_interrupt_handler interrupt_handler;
+            return nrx::monitor_profiler(duration, nrx::dump_profile_record);
         });
     }
-
-    // Adds an entry to the queue at a time.
-    void arrive(std::chrono::milliseconds at, const byte_list& entry) {
-        host.clock().plan(at, [this, entry] { driver->queue->add(entry); });
-    }
-
-    run watch(std::uint32_t duration = 0) {
-        log_read_ = false;
-        bool has_ended = false;
-        const outcome written = capture([&] {
-            const nrx::interrupt_stop stop_while_running;
-            has_ended = nrx::monitor_profiler(duration, nrx::dump_profile_record);
-        });
-        return {has_ended, written.out, written.err};
-    }
-
-private:
-    bool log_read_ = false;
 };
 
-TEST(monitor_words, give_duration_and_human_flag_and_are_announced) {
-    for (const auto& [words, duration, human, taken, line] :
-         rows<std::string, std::uint32_t, bool, int, std::string>{
-             {"", 0, false, 0, "0 us mode=auto (humanReadable=disabled)\n"},
-             {"human", 0, true, 1, "0 us mode=auto (humanReadable=enabled)\n"},
-             {"human 250 x", 250000, true, 2, "250000 us mode=enable (humanReadable=enabled)\n"},
-             {"auto human", 0, false, 1, "0 us mode=auto (humanReadable=disabled)\n"},
-             {"0x10", 16000, false, 1, "16000 us mode=enable (humanReadable=disabled)\n"},
-             {"0", 0, false, 1, "0 us mode=auto (humanReadable=disabled)\n"},
-             {"4294967", 4294967000, false, 1, "-296 us mode=enable (humanReadable=disabled)\n"},
-         }) {
-        const word_vector all(split(words));
+TEST(monitor_args, duration_and_human_flag_are_parsed_and_printed) {
+    for (const auto& [arguments, count, line] : rows<std::string, int, std::string>{
+             {"", 0, "0 us mode=auto (humanReadable=disabled)\n"},
+             {"human", 1, "0 us mode=auto (humanReadable=enabled)\n"},
+             {"human 250 x", 2, "250000 us mode=enable (humanReadable=enabled)\n"},
+             {"auto human", 1, "0 us mode=auto (humanReadable=disabled)\n"},
+             {"0x10", 1, "16000 us mode=enable (humanReadable=disabled)\n"},
+             {"0", 1, "0 us mode=auto (humanReadable=disabled)\n"},
+             {"4294967", 1, "-296 us mode=enable (humanReadable=disabled)\n"}}) {
+        const argument_vector all(split(arguments));
         int index = 0;
-        nrx::argument_words left(all.all(), index);
-        nrx::monitor_args args;
-        EXPECT_EQ(capture([&] { args = nrx::parse_monitor_args(left); }).out, "duration=" + line);
-        EXPECT_EQ(std::tuple(args.duration, args.human, index), std::tuple(duration, human, taken))
-            << line;
+        nrx::argument_cursor cursor(all.all(), index);
+        EXPECT_EQ(capture([&] { nrx::parse_monitor_args(cursor); }).out, "duration=" + line);
+        EXPECT_EQ(index, count) << line;
     }
-    for (const std::string word : {"", "human", "Auto", "-1", "4294968", "1s"}) {
-        const outcome refused = capture([&] { nrx::parse_duration(word); });
-        EXPECT_EQ(refused.out, "duration parameter is invalid (" + word + ")\n");
+    for (const std::string duration : {"", "human", "Auto", "-1", "4294968", "1s"}) {
+        const outcome refused = capture([&] { nrx::parse_duration(duration); });
+        EXPECT_EQ(refused.out, "duration parameter is invalid (" + duration + ")\n");
         EXPECT_EQ(refused.status, 1);
     }
 }
 
-TEST_F(monitor, stream_is_printed_as_it_comes_until_the_end_marker) {
+TEST_F(monitor, stream_is_printed_until_the_end_marker) {
     driver->queue->add(record_bytes(3, 1));
-    arrive(10ms, record_bytes(3, 2));
-    arrive(10ms, record_bytes(3, 3));
-    arrive(20ms, marker);
-    EXPECT_EQ(watch(), ended(dumped(3, 1) + dumped(3, 2) + dumped(3, 3)));
+    add_in(10ms, record_bytes(3, 2));
+    add_in(20ms, end_marker);
+    EXPECT_EQ(watch(), complete(dumped(3, 1) + dumped(3, 2)));
     EXPECT_EQ(host.clock().now(), 120ms);
-    const std::string is_there = "data available KeltoNRXProfileDriver";
-    const std::string take = "dequeue KeltoNRXProfileDriver room 48";
-    const std::string wait = "wait KeltoNRXProfileDriver";
-    const std::string read_log = "call profile 2 scalars [0xd1] in [] results 0 room 65536";
-    EXPECT_EQ(happened(), (lines{"open KeltoNRXProfileDriver type 0",
-                                 "map KeltoNRXProfileDriver memory 0",
-                                 "allocate port",
-                                 "attach port to KeltoNRXProfileDriver notification 0 reference 0",
-                                 "open profile type 0",
-                                 "call profile 1 scalars [0xd2] in [00 00 00 00] results 0 room 0",
-                                 "close profile",
-                                 is_there,
-                                 take,
-                                 is_there,
-                                 wait,
-                                 is_there,
-                                 take,
-                                 is_there,
-                                 wait,
-                                 is_there,
-                                 take,
-                                 is_there,
-                                 wait,
-                                 is_there,
-                                 take,
-                                 "sleep 100000 us",
-                                 is_there,
-                                 "open profile type 0",
-                                 read_log,
-                                 "close profile",
-                                 "open profile type 0",
-                                 read_log,
-                                 "close profile",
-                                 "unmap KeltoNRXProfileDriver",
-                                 "close KeltoNRXProfileDriver"}));
+    const std::string check = "data available driver\n";
+    const std::string dequeue = check + "dequeue driver capacity 48\n";
+    const std::string wait = check + "wait driver\n";
+    const std::string read_log =
+        "open profile type 0\ncall profile 2 [0xd1] capacity 65536\nclose profile\n";
+    EXPECT_EQ(new_events(),
+              "open driver type 0\nmap driver memory 0\nallocate port\n"
+              "attach port to driver notification 0 reference 0\nopen profile type 0\n"
+              "call profile 1 [0xd2] in [00 00 00 00]\nclose profile\n" +
+                  dequeue + wait + dequeue + wait + dequeue + "sleep 100000 us\n" + check +
+                  read_log + read_log + "unmap driver\nclose driver\n");
 }
 
-TEST_F(monitor, end_marker_in_every_position_lets_the_last_drain_pick_up_what_follows_it) {
-    for (std::size_t position = 0; position <= 3; ++position) {
-        std::string printed;
-        for (std::uint8_t i = 0; i <= 3; ++i) {
-            driver->queue->add(i == position ? marker : record_bytes(3, i));
-            if (i != position) printed += dumped(3, i);
-        }
-        EXPECT_EQ(watch(), ended(printed)) << position;
+TEST_F(monitor, ends_100_ms_after_the_marker_or_a_record_past_the_duration) {
+    const std::string both = dumped(3, 1) + dumped(3, 2);
+    using schedule = rows<std::chrono::milliseconds, std::uint8_t>;  // delay, fill; 0: end marker
+    for (const auto& [entries, duration, printed, time, remaining] :
+         rows<schedule, std::uint32_t, std::string, std::chrono::milliseconds, std::size_t>{
+             {{{0ms, 0}, {0ms, 1}, {0ms, 2}}, 0, both, 100ms, 0},
+             {{{0ms, 1}, {0ms, 0}, {0ms, 2}}, 0, both, 100ms, 0},
+             {{{10ms, 1}, {10ms, 2}, {20ms, 0}}, 0, both, 120ms, 0},
+             {{{0ms, 0}, {90ms, 1}, {95ms, 0}, {95ms, 2}}, 0, dumped(3, 1), 100ms, 1},
+             {{{50ms, 1}, {51ms, 2}, {150ms, 0}}, 50'000, both, 151ms, 0}}) {
+        driver->queue->clear();
+        const auto start = host.clock().now();
+        for (const auto& [delay, fill] : entries)
+            add_in(delay, fill == 0 ? end_marker : record_bytes(3, fill));
+        EXPECT_EQ(watch(duration), complete(printed));
+        EXPECT_EQ(host.clock().now() - start, time);
+        EXPECT_EQ(driver->queue->size(), remaining);
     }
+    EXPECT_TRUE(new_calls().ends_with(
+        "profile 1 [0xd2] in [50 c3 00 00]\n"
+        "profile 2 [0xd1] capacity 65536\nprofile 2 [0xd1] capacity 65536\n"));
 }
 
-TEST_F(monitor, second_end_marker_ends_the_last_drain_and_the_grace_lets_records_in) {
-    driver->queue->add(marker);
-    arrive(90ms, record_bytes(3, 1));
-    arrive(95ms, marker);
-    arrive(95ms, record_bytes(3, 2));
-    EXPECT_EQ(watch(), ended(dumped(3, 1)));
-    EXPECT_EQ(driver->queue->size(), 1U);
-}
-
-TEST_F(monitor, duration_is_told_to_the_coprocessor_and_ends_the_run_when_data_arrive_after_it) {
-    arrive(50ms, record_bytes(3, 1));
-    arrive(51ms, record_bytes(3, 2));
-    arrive(70ms, record_bytes(3, 3));
-    EXPECT_EQ(watch(50'000), ended(dumped(3, 1) + dumped(3, 2) + dumped(3, 3)));
-    EXPECT_EQ(host.clock().now(), 151ms);
-    EXPECT_EQ(logged("call")[0], "call profile 1 scalars [0xd2] in [50 c3 00 00] results 0 room 0");
-}
-
-TEST_F(monitor, starts_only_if_it_can_tell_the_duration_or_there_is_no_coprocessor) {
+TEST_F(monitor, starts_only_if_the_duration_is_accepted) {
     service->drop_report(0xd2);
-    EXPECT_EQ(watch(), run(false, "",
-                           failed(command_file, "kr == 0 ", unsupported_text) +
-                               failed(monitor_file, "kr == 0 ", unsupported_text)));
-    host.remove("profile");
-    driver->queue->add(marker);
-    EXPECT_EQ(watch(1000),
-              run(true, "done\n",
-                  failed(channel_file, "service") +
-                      failed("base/profile_records.cpp", "result == 0 ", not_found_text)));
+    EXPECT_EQ(watch(), result(false, kr_report(file::command_channel, unsupported_text) +
+                                         kr_report(file::monitor, unsupported_text)));
+    remove_service();
+    driver->queue->add(end_marker);
+    EXPECT_EQ(watch(1000), result(true, "done\n" + library_report(file::channel, "service") +
+                                            library_report(file::profile_record, "result == 0 ",
+                                                           not_found_text)));
 }
 
-TEST_F(monitor, queue_that_fails_ends_it_and_keeps_what_is_printed) {
+TEST_F(monitor, failure_of_the_queue_ends_it) {
     driver->queue->add(record_bytes(3, 1));
     driver->queue->add(byte_list(49, 1));
-    const std::string no_room =
-        failed(monitor_file, "kr == 0 ", "reply larger than the room for it (0xe0000402)");
-    EXPECT_EQ(watch(), run(false, dumped(3, 1), no_room + no_room));
+    const std::string too_long =
+        kr_report(file::monitor, "reply larger than the room for it (0xe0000402)");
+    EXPECT_EQ(watch(), result(false, dumped(3, 1) + too_long + too_long));
     driver->queue->clear();
-    host.clock().plan(30ms, [this] { host.remove(driver_name); });
-    EXPECT_EQ(watch(), run(false, "", failed(monitor_file, "kr == 0 ", not_found_text)));
+    host.clock().run_at(30ms, [this] { remove_driver(); });
+    EXPECT_EQ(watch(), result(false, kr_report(file::monitor, not_found_text)));
 }
 
-TEST_F(monitor, short_entries_are_reported_and_read_as_0_beyond_their_end) {
+TEST_F(monitor, short_entry_is_reported_and_reads_as_0_beyond_its_end) {
     driver->queue->add({3, 0xff});
     driver->queue->add({});
-    const std::string too_short = failed(monitor_file, "length >= 48");
+    const std::string too_short = library_report(file::monitor, "length >= 48");
     EXPECT_EQ(watch(),
-              ended("prof-event 03ff" + std::string(92, '0') + "\n", too_short + too_short));
+              complete("prof-event 03ff" + std::string(92, '0') + "\n", too_short + too_short));
 }
 
-TEST_F(monitor, interrupt_at_any_platform_call_ends_it_in_good_order) {
-    driver->actions[11] = [this] { driver->queue->add(marker); };
-    const auto stream_a_record = [&] {
+TEST_F(monitor, interrupt_at_any_platform_call_ends_it) {
+    std::size_t stops = 0;
+    driver->actions[11] = [&] {
+        ++stops;
+        driver->queue->add(end_marker);
+    };
+    const auto watch_a_record = [&] {
         driver->queue->clear();
         driver->queue->add(record_bytes(3, 1));
-        arrive(std::chrono::duration_cast<std::chrono::milliseconds>(host.clock().now()) + 10ms,
-               marker);
+        add_in(10ms, end_marker);
+        return watch();
     };
-    stream_a_record();
-    const std::size_t calls_before = host.calls_made();
-    watch();
-    const std::size_t calls = host.calls_made() - calls_before;
+    watch_a_record();
+    const std::size_t calls = host.calls_made();
     for (std::size_t call = 1; call <= calls; ++call) {
-        stream_a_record();
-        const auto before = times(end_stream_call);
         host.before_call(call, [] { std::raise(SIGINT); });
-        EXPECT_EQ(watch(), ended(dumped(3, 1))) << call;
-        EXPECT_EQ(times(end_stream_call), before + 1) << call;
+        EXPECT_EQ(watch_a_record(), complete(dumped(3, 1))) << call;
+        EXPECT_EQ(stops, call);
     }
 }
 
-TEST_F(monitor, interrupt_that_the_driver_refuses_is_reported_and_the_monitor_goes_on) {
-    driver->answers[11] = {{.code = platform::simulated::io_failure}};
-    host.clock().plan(10ms, [] { std::raise(SIGINT); });
-    arrive(20ms, marker);
-    EXPECT_EQ(watch(), ended("", failed(kernel_file, "kr == 0 ", io_text)));
+using platform::simulated::io_failure;
+
+const std::string status_call = "driver 1 [] results 1\n";
+const std::string enable_call = "driver 0 [0x1]\n";
+const std::string disable_call = "driver 0 [0x0]\n";
+const std::string start_call =
+    "profile 3 [0x24] in [09 00 00 00 02 00 00 00 00 00 00 00 80 00 00 00 zeros]\n";
+const std::string stop_call =
+    "profile 3 [0x24] in [09 00 00 00 00 00 00 00 02 00 00 00 ff ff ff ff zeros]\n";
+
+struct scm_monitor : profiler_test {
+    // A transfer on smb1, channel 7, and the end of the stream.
+    void add_transfer() {
+        driver->queue->add(joined({{3, 7, 2, 9}, u32_report({1, 100, 0, 1, 5000}), byte_list(24)}));
+        driver->queue->add(end_marker);
+    }
+
+    static outcome watch(const std::string& duration, const std::string& args = "scm:smb1:ch7") {
+        const argument_vector all(split(args));
+        int index = 0;
+        return capture([&] { nrx::scm_monitor(duration, all.all(), index); });
+    }
+};
+
+TEST_F(scm_monitor, configures_the_coprocessor_and_prints_transfers) {
+    const std::string refused = kr_report(file::kernel_profiler, io_text);
+    for (const auto& [is_connected, enabling, reports] :
+         rows<bool, platform::return_code, std::string>{{false, platform::success, ""},
+                                                        {false, io_failure, refused + refused},
+                                                        {true, platform::success, ""}}) {
+        driver->replies[0] = {{.code = enabling}};
+        driver->replies[1] = {{.scalar = is_connected}};
+        add_transfer();
+        const outcome written = watch("10");
+        EXPECT_EQ(written.out + written.err,
+                  "smb1.7: scm_write wqr_timestamp=100 scm_timestamp=5000\ndone\n" + reports);
+        const std::string calls = start_call +
+                                  "profile 1 [0xd2] in [10 27 00 00]\n"
+                                  "profile 2 [0xd1] capacity 65536\n" +
+                                  stop_call;
+        EXPECT_EQ(new_calls(),
+                  status_call + (is_connected ? calls : enable_call + calls + disable_call));
+    }
+}
+
+TEST_F(scm_monitor, failure_after_enabling_is_reported_and_disables) {
+    const std::string report = library_report(file::scm_monitor, "success");
+    set_reply(0x24, platform::unsupported);
+    const outcome refused = watch("10");
+    EXPECT_EQ(refused.out + refused.err, "Can't enable SCM profiler\n" + report);
+    EXPECT_EQ(new_calls(), status_call + enable_call + start_call + disable_call);
+
+    service->set_command(0x24, [count = 0](platform::byte_view, byte_list&) mutable {
+        return count++ == 0 ? platform::success : io_failure;
+    });
+    driver->queue = nullptr;
+    EXPECT_TRUE(watch("10").err.ends_with(library_report(file::monitor, "success") + report));
+    EXPECT_EQ(new_calls(), status_call + enable_call + start_call + stop_call + disable_call);
+}
+
+TEST_F(scm_monitor, interrupt_is_handled_until_just_before_it_disables) {
+    add_transfer();
+    std::map<std::string, bool> handled;  // by call
+    for (std::size_t call = 1; call < 100; ++call)
+        host.before_call(call, [&] { handled[new_calls()] = !has_default_interrupt_action(); });
+    watch("10");
+    EXPECT_TRUE(handled.at(enable_call));
+    EXPECT_FALSE(handled.at(disable_call));
+}
+
+TEST_F(scm_monitor, ends_early_without_profiler_status_or_valid_arguments) {
+    const std::string success = library_report(file::scm_monitor, "success");
+    driver->replies[1] = {{.code = io_failure}, {}};
+    EXPECT_EQ(watch("10", "scm:smb1").err, kr_report(file::kernel_profiler, io_text) + success);
+    EXPECT_EQ(watch("10", "").err, library_report(file::scm_monitor, "configs.size() != 0"));
+    EXPECT_EQ(watch("auto", "smb1").err, library_report(file::config_parser, "result") + success);
+    EXPECT_EQ(watch("human", "scm:smb1").out, "duration parameter is invalid (human)\n");
+    EXPECT_EQ(new_calls(), status_call + status_call + status_call + status_call);
+    remove_service();
+    EXPECT_EQ(watch("10", "scm:smb1").out, "wqr fw profiler is not available\n");
+    EXPECT_EQ(new_calls(), "");
 }
 
 }  // namespace tests

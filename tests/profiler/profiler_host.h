@@ -1,4 +1,4 @@
-// A host with both halves of a profiler whose answers are scripted.
+// A host with both halves of a profiler whose replies are scripted.
 #pragma once
 
 #include <cstdint>
@@ -7,95 +7,81 @@
 #include <string>
 #include <vector>
 
-#include "nrxctl/base/profile_record.h"
 #include "tests/support/device_test.h"
 #include "tests/support/report_bytes.h"
 #include "tests/support/rows.h"
 
 namespace tests {
 
-using lines = std::vector<std::string>;
+namespace file = source_file;
 
-inline constexpr const char* driver_name = "KeltoNRXProfileDriver";
-
-// The kernel's driver: every method succeeds with nothing unless a script says otherwise.
+// The kernel's driver: every method succeeds and returns nothing unless a script says otherwise.
 class scripted_driver final : public platform::simulated::driver {
 public:
-    // What a method answers, call after call; the last answer stays.
-    struct answer {
+    using queue_pointer = std::shared_ptr<platform::simulated::shared_queue>;
+
+    // The replies of a method, call by call; the last one is repeated.
+    struct reply {
         platform::return_code code = platform::success;
         byte_list bytes = {};
         std::uint64_t scalar = 0;
     };
 
-    platform::return_code call(std::uint32_t selector, const platform::call_inputs& inputs,
+    platform::return_code call(std::uint32_t method, const platform::call_inputs& inputs,
                                platform::call_outputs& outputs) override;
-    std::shared_ptr<platform::simulated::shared_queue> memory(std::uint32_t type) override {
-        return type == 0 ? queue : nullptr;
-    }
-    std::shared_ptr<platform::simulated::shared_queue> notification(std::uint32_t type) override {
-        return memory(type);
-    }
+    queue_pointer memory(std::uint32_t type) override { return type == 0 ? queue : nullptr; }
+    queue_pointer notification(std::uint32_t type) override { return memory(type); }
 
-    std::map<std::uint32_t, std::vector<answer>> answers;
-    std::map<std::uint32_t, std::function<void()>> actions;  // done when a method is called
-    std::shared_ptr<platform::simulated::shared_queue> queue =
-        std::make_shared<platform::simulated::shared_queue>();
+    std::map<std::uint32_t, std::vector<reply>> replies;
+    std::map<std::uint32_t, std::function<void()>> actions;  // run when a method is called
+    queue_pointer queue = std::make_shared<platform::simulated::shared_queue>();
 };
 
-// A record of a type, whose other bytes tell it from others.
-byte_list record_bytes(std::uint8_t type, std::uint8_t mark);
+// A record of a type, with all other bytes set to fill, and the line that is its dump.
+byte_list record_bytes(std::uint8_t type, std::uint8_t fill);
+std::string dumped(std::uint8_t type, std::uint8_t fill);
+inline const byte_list end_marker = record_bytes(0, 0);
 
-// The line that the undecoded printer writes for it.
-std::string dumped(std::uint8_t type, std::uint8_t mark);
-
-// Several byte lists, one after the other.
 byte_list joined(const std::vector<byte_list>& lists);
 
-// A configuration record without services in the words of the log: bytes of profiler, component and
-// state, and the report mask.
-std::string config_bytes(const std::string& profiler, const std::string& component,
-                         const std::string& state, const std::string& mask);
+// The failure report of a check whose condition is "kr == 0 ".
+inline std::string kr_report(const char* source, const char* code) {
+    return library_report(source, "kr == 0 ", code);
+}
 
-// Whether an interrupt would end the process.
-bool has_default_action();
+bool has_default_interrupt_action();
 
-// Calls on the driver, in the words of the log.
-inline constexpr const char* enable_call =
-    "call KeltoNRXProfileDriver 0 scalars [0x1] in [] results 0 room 0";
-inline constexpr const char* disable_call =
-    "call KeltoNRXProfileDriver 0 scalars [0x0] in [] results 0 room 0";
-inline constexpr const char* status_call =
-    "call KeltoNRXProfileDriver 1 scalars [] in [] results 1 room 0";
-inline constexpr const char* end_stream_call =
-    "call KeltoNRXProfileDriver 11 scalars [] in [] results 0 room 0";
+// The result of an operation, and all that it wrote.
+using result = std::pair<bool, std::string>;
+result attempt(const std::function<bool()>& operation);
 
+// The tool's clock is the host's. After each test, an interrupt ends the process again.
 class profiler_test : public device_test {
+public:
+    // The driver, and the service "profile", which accepts every request and returns nothing.
+    profiler_test();
+    ~profiler_test() override { EXPECT_TRUE(has_default_interrupt_action()); }
+    profiler_test(const profiler_test&) = delete;
+    profiler_test& operator=(const profiler_test&) = delete;
+
 protected:
-    // The tool's clock is the host's.
-    void SetUp() override;
-    // Whatever was done, an interrupt ends the process again.
-    void TearDown() override;
+    void remove_driver() { host.remove("KeltoNRXProfileDriver"); }
+    void remove_service() { host.remove("profile"); }
 
-    // Registers the kernel's driver and the service "profile", which takes every request of the
-    // profiler and answers with nothing.
-    void put_both_halves();
-    scripted_driver& put_driver();
-    interface_driver& put_profile_service();
+    // Sets the reply of the service to a command.
+    void set_reply(std::uint32_t command, platform::return_code code, const byte_list& reply = {});
 
-    // Lets the service answer a command.
-    void answer(std::uint32_t command, platform::return_code code, const byte_list& reply = {});
+    // Sets the log of the coprocessor: a record that is read once.
+    void set_fw_log(const byte_list& record);
 
-    // How often a call was made.
-    [[nodiscard]] std::ptrdiff_t times(std::string_view call) const;
+    // The log since the last time in short, without look-ups and releases; and the method calls in
+    // it, such as "profile 3 [0x24] in [01 zeros]": scalars in brackets, "zeros" for 36 of them.
+    std::string new_events();
+    std::string new_calls();
 
-    // The calls and what else happened on the host since the last time, but for services looked up
-    // and released.
-    lines happened();
-
-    // Runs a subcommand as the command line gives it; taken is then how many further words it took.
-    outcome profile(const std::string& words);
-    int taken = 0;
+    // Runs a subcommand with its arguments; arguments_read is then how many of them it read.
+    outcome profile(const std::string& command_line);
+    int arguments_read = 0;
 
     scripted_driver* driver = nullptr;
     interface_driver* service = nullptr;
@@ -103,14 +89,5 @@ protected:
 private:
     std::size_t seen_ = 0;
 };
-
-// Source files of the library, and failure reports of checks in them.
-inline constexpr const char* apply_file = "profiler/apply_configs.cpp";
-inline constexpr const char* channel_file = "base/channel.cpp";
-inline constexpr const char* command_file = "base/command_channel.cpp";
-inline constexpr const char* conn_file = "profiler/profiler_conn.cpp";
-inline constexpr const char* grammar_file = "profiler/config_grammar.cpp";
-inline constexpr const char* kernel_file = "profiler/kernel_profiler.cpp";
-inline constexpr const char* monitor_file = "profiler/monitor.cpp";
 
 }  // namespace tests

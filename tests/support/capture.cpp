@@ -7,34 +7,37 @@
 #include <sys/mman.h>
 #include <unistd.h>
 
+#include "nrxctl/base/output.h"
+
 namespace tests {
 
 namespace {
 
-// Sends a descriptor into memory for as long as it lives.
-class redirection {
+// Redirects a descriptor into memory for its lifetime.
+class redirected_descriptor {
 public:
-    explicit redirection(int descriptor)
+    explicit redirected_descriptor(int descriptor)
         : descriptor_(descriptor),
           saved_(::dup(descriptor)),
           memory_(::memfd_create("output", MFD_CLOEXEC)) {
         ::dup2(memory_, descriptor_);
     }
-    ~redirection() {
+    ~redirected_descriptor() {
         ::dup2(saved_, descriptor_);
         ::close(saved_);
         ::close(memory_);
     }
-    redirection(const redirection&) = delete;
-    redirection& operator=(const redirection&) = delete;
+    redirected_descriptor(const redirected_descriptor&) = delete;
+    redirected_descriptor& operator=(const redirected_descriptor&) = delete;
 
     [[nodiscard]] std::string text() const {
         std::string all;
-        std::array<char, 4096> part;
+        std::array<char, 4096> buffer;
         off_t offset = 0;
-        for (ssize_t got = 0; (got = ::pread(memory_, part.data(), part.size(), offset)) > 0;) {
-            all.append(part.data(), static_cast<std::size_t>(got));
-            offset += got;
+        ssize_t count = 0;
+        while ((count = ::pread(memory_, buffer.data(), buffer.size(), offset)) > 0) {
+            all.append(buffer.data(), static_cast<std::size_t>(count));
+            offset += count;
         }
         return all;
     }
@@ -45,37 +48,48 @@ private:
     int memory_;
 };
 
-}  // namespace
-
-outcome capture(const std::function<void()>& action) {
-    std::fflush(nullptr);
-    const redirection out(STDOUT_FILENO);
-    const redirection err(STDERR_FILENO);
-    outcome result;
+// Runs action. Returns the exit status if it would have ended the process.
+std::optional<int> exit_status(const std::function<void()>& action) {
     try {
         action();
     } catch (const process_ended& end) {
-        result.status = end.status;
+        return end.status;
     }
+    return std::nullopt;
+}
+
+}  // namespace
+
+outcome capture(const std::function<void()>& action) {
+    nrx::memory_sink out;
+    nrx::memory_sink err;
+    const nrx::scoped_sink installed_out(nrx::standard_stream::output, out);
+    const nrx::scoped_sink installed_err(nrx::standard_stream::error, err);
+    const auto status = exit_status(action);
+    return {out.text(), without_line_numbers(err.text()), err.text(), status};
+}
+
+outcome capture_descriptors(const std::function<void()>& action) {
     std::fflush(nullptr);
-    result.out = out.text();
-    result.err_as_written = err.text();
-    result.err = without_line_numbers(result.err_as_written);
-    return result;
+    const redirected_descriptor out(STDOUT_FILENO);
+    const redirected_descriptor err(STDERR_FILENO);
+    const auto status = exit_status(action);
+    std::fflush(nullptr);
+    return {out.text(), without_line_numbers(err.text()), err.text(), status};
 }
 
 std::string without_line_numbers(const std::string& text) {
     constexpr std::string_view digits = "0123456789";
     std::string shortened;
-    for (std::size_t at = 0; at < text.size();) {
-        const std::string_view written = shortened;
+    for (std::size_t position = 0; position < text.size();) {
+        const std::string_view before = shortened;
         const std::size_t number_end =
-            std::min(text.find_first_not_of(digits, at + 1), text.size());
-        if (text[at] == ':' && number_end > at + 1 &&
-            (written.ends_with(".cpp") || written.ends_with(".h"))) {
-            at = number_end;
+            std::min(text.find_first_not_of(digits, position + 1), text.size());
+        if (text[position] == ':' && number_end > position + 1 &&
+            (before.ends_with(".cpp") || before.ends_with(".h"))) {
+            position = number_end;
         } else {
-            shortened += text[at++];
+            shortened += text[position++];
         }
     }
     return shortened;

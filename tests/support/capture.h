@@ -13,16 +13,19 @@ struct process_ended {
 };
 
 struct outcome {
-    std::string out;             // standard output
-    std::string err;             // standard error; line numbers of source files are left out
-    std::string err_as_written;  // standard error with them
-    std::optional<int> status;   // how the process would have ended, if it would have
+    std::string out;            // standard output
+    std::string err;            // standard error without line numbers of source files
+    std::string raw_err;        // standard error as written
+    std::optional<int> status;  // the exit status, if the process would have ended
 };
 
-// Runs action with standard output and standard error redirected.
+// Runs action with memory sinks for standard output and standard error.
 outcome capture(const std::function<void()>& action);
 
-// "nrxctl/base/channel.cpp:17" without its line number, wherever it stands in the text.
+// The same with both descriptors redirected, for text that does not leave through a sink.
+outcome capture_descriptors(const std::function<void()>& action);
+
+// Removes the line numbers of source files: "nrxctl/base/channel.cpp:17" loses its ":17".
 std::string without_line_numbers(const std::string& text);
 
 }  // namespace tests

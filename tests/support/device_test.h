@@ -1,4 +1,4 @@
-// The vocabulary of tests that work on a virtual host of their own.
+// A test fixture with a virtual host, and helpers for tests that use one.
 #pragma once
 
 #include <cstdint>
@@ -13,6 +13,7 @@
 #include "platform/virtual/current_machine.h"
 #include "platform/virtual/interface_driver.h"
 #include "tests/support/capture.h"
+#include "tests/support/source_files.h"
 
 namespace tests {
 
@@ -21,32 +22,34 @@ using platform::simulated::failure;
 using platform::simulated::interface_driver;
 using platform::simulated::machine;
 
-// Registers an interface service with a name and an id; the driver that answers for it.
-interface_driver& put_service(machine& host, std::string_view name, std::int32_t id);
+// Adds an interface service with a name and an id. Returns its driver.
+interface_driver& add_service(machine& host, std::string_view name, std::int32_t id);
 
-// What a failure report says of a code.
+// The texts of return codes in failure reports.
 inline constexpr const char* bad_argument_text = "bad argument (0xe00002c2)";
 inline constexpr const char* no_memory_text = "out of memory (0xe00002bd)";
 inline constexpr const char* unsupported_text = "unsupported request (0xe00002c7)";
 inline constexpr const char* not_found_text = "service not found (0xe00002f0)";
 inline constexpr const char* io_text = "device i/o failure (0xe0000401)";
 
-// The line that a failed check of a subsystem writes, without the line number of the file.
+// The failure report of a check by a subsystem, without the line number of the file.
 std::string failure_line(std::string_view label, std::string_view condition, std::string_view file,
                          std::string_view code = "");
 
-// The same of the library, whose files stand in nrxctl/.
-std::string failed(std::string_view file, std::string_view condition, std::string_view code = "");
+// The same for a check of the library.
+std::string library_report(std::string_view file, std::string_view condition,
+                           std::string_view code = "");
 
-// What an operation that must end with a code writes on standard error; it writes nothing else.
-std::string reported(platform::return_code expected,
-                     const std::function<platform::return_code()>& operation);
+// Runs an operation that must return a code and print nothing. Returns what it wrote on standard
+// error.
+std::string report_of(platform::return_code expected,
+                      const std::function<platform::return_code()>& operation);
 
-// The first service with a registry name, as a client finds it.
+// Finds the first service with a registry name, as a client does.
 platform::service service_named(std::string_view name);
 
-// A host that is empty at first, installed for the length of the test; nothing may be left open on
-// it when the handles of the fixture are gone.
+// A host without services, installed for the duration of the test. Nothing may remain open on it at
+// the end.
 class device_test : public ::testing::Test {
 public:
     device_test() { host.record_calls(); }
@@ -55,8 +58,8 @@ public:
     device_test& operator=(const device_test&) = delete;
 
 protected:
-    // The logged events that begin with a word ("call", "open", "close").
-    [[nodiscard]] std::vector<std::string> logged(std::string_view word) const;
+    // The log lines whose first word is kind: "call", "open", "close" and others.
+    [[nodiscard]] std::vector<std::string> logged_calls(std::string_view kind) const;
 
     machine host;
 

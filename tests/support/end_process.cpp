@@ -1,4 +1,4 @@
-// Stands in for the library's end of the process: a test goes on after it.
+// Replaces the library's end_process: throws, so that a test can continue.
 #include "nrxctl/base/end_process.h"
 
 #include "tests/support/capture.h"

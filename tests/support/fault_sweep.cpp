@@ -13,39 +13,40 @@ using platform::simulated::machine;
 void sweep_faults(const std::function<std::unique_ptr<machine>()>& make_host,
                   const std::function<void()>& operation,
                   const std::function<bool(const fault&)>& acceptable) {
-    const auto good_host = make_host();
+    const auto reference_host = make_host();
     {
-        const installed_machine installed(*good_host);
+        const installed_machine installed(*reference_host);
         capture(operation);
     }
-    EXPECT_EQ(good_host->open_handles(), 0U) << "in the good run";
-    const std::size_t calls = good_host->calls_made();
+    EXPECT_EQ(reference_host->open_handles(), 0U) << "in the successful run";
+    const std::size_t calls = reference_host->calls_made();
     ASSERT_GT(calls, 0U);
     for (std::size_t call = 1; call <= calls; ++call) {
-        for (const auto how : platform::simulated::all_failures) {
+        for (const auto kind : platform::simulated::all_failures) {
             const auto host = make_host();
             const installed_machine installed(*host);
             host->record_calls();
-            host->fail_call(call, how);
+            host->fail_call(call, kind);
             std::string name;
             host->before_call(call, [&] { name = host->log().back(); });
             const outcome result = capture(operation);
-            const fault one{call, name, how, result};
+            const fault fault{call, name, kind, result};
             const std::string where = "call " + std::to_string(call) + " (" + name +
                                       "), which fails with " +
-                                      std::string(platform::return_code_text(code_of(how)));
+                                      std::string(platform::return_code_text(code_of(kind)));
             EXPECT_FALSE(name.empty()) << "call " << call << " was not made a second time";
-            EXPECT_TRUE(acceptable(one)) << where << "\n" << one.result.out << one.result.err;
+            EXPECT_TRUE(acceptable(fault)) << where << "\n" << fault.result.out << fault.result.err;
             EXPECT_EQ(host->open_handles(), 0U) << where;
         }
     }
 }
 
-bool is_told(const fault& one) {
-    const bool tells_nothing_new = one.name.find("IONameMatch = \"WQR_") != std::string::npos;
-    const bool is_a_reply = one.name.starts_with("call ") || one.name.starts_with("feature report");
-    return tells_nothing_new || (is_a_reply && one.how == failure::nothing) ||
-           !one.result.err.empty();
+bool is_reported(const fault& fault) {
+    const bool is_prefixed_lookup = fault.name.find("IONameMatch = \"WQR_") != std::string::npos;
+    const bool is_reply =
+        fault.name.starts_with("call ") || fault.name.starts_with("feature report");
+    return is_prefixed_lookup || (is_reply && fault.kind == failure::empty_result) ||
+           !fault.result.err.empty();
 }
 
 }  // namespace tests

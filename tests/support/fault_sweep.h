@@ -12,24 +12,23 @@ namespace tests {
 
 struct fault {
     std::size_t call;  // 1 is the first call of the operation
-    std::string name;  // the failed call in the words of the log
-    platform::simulated::failure how;
+    std::string name;  // the failed call as the log writes it
+    platform::simulated::failure kind;
     outcome result;
 };
 
-// Counts the calls of a good run of operation on a host made by make_host, then runs it once per
-// call and failure on a fresh host each. Every run must end, leave nothing open, and be acceptable:
-// by default, it wrote on standard error.
+// Counts the calls of a successful run of operation on a host made by make_host, then runs it once
+// for each call and kind of failure, each time on a new host. Every run must end, leave nothing
+// open and be acceptable: by default, it wrote on standard error.
 void sweep_faults(
     const std::function<std::unique_ptr<platform::simulated::machine>()>& make_host,
     const std::function<void()>& operation,
-    const std::function<bool(const fault&)>& acceptable = [](const fault& one) {
-        return !one.result.err.empty();
+    const std::function<bool(const fault&)>& acceptable = [](const fault& fault) {
+        return !fault.result.err.empty();
     });
 
-// What most operations owe to a failed call: a report. Not owed where the failure tells nothing new
-// (the look-up of a prefixed name finds none in a good run either) or is none (a reply without
-// bytes).
-bool is_told(const fault& one);
+// What most operations must do about a failed call: report it. Not required if the look-up of a
+// prefixed name fails, which finds nothing in a successful run either, or if a reply is empty.
+bool is_reported(const fault& fault);
 
 }  // namespace tests

@@ -6,19 +6,19 @@ namespace {
 
 class scripted_events final : public platform::simulated::hid_event_source {
 public:
-    explicit scripted_events(scripted_news news) : news_(std::move(news)) {}
+    explicit scripted_events(scripted_notifications news) : news_(std::move(news)) {}
 
     [[nodiscard]] std::optional<clock_time> next_due() const override {
         return news_.empty() ? std::nullopt : std::optional(news_.front().first);
     }
-    platform::simulated::hid_news take_news() override {
+    platform::simulated::hid_notification pop_notification() override {
         auto first = std::move(news_.front().second);
         news_.pop_front();
         return first;
     }
 
 private:
-    scripted_news news_;
+    scripted_notifications news_;
 };
 
 }  // namespace
@@ -28,23 +28,23 @@ std::optional<clock_time> scripted_records::next_due() const {
     return is_on && !script.empty() ? std::optional(script.front().first) : std::nullopt;
 }
 
-byte_list scripted_records::take_record() {
+byte_list scripted_records::pop_record() {
     byte_list first = std::move(script.front().second);
     script.pop_front();
     return first;
 }
 
-scripted_records& put_hid_device(machine& host, std::string_view name, std::int32_t location) {
+scripted_records& add_hid_device(machine& host, std::string_view name, std::int32_t location) {
     auto records = std::make_shared<scripted_records>();
     host.add({.name = std::string(name),
               .classes = {"KeltoNRXHIDDevice"},
               .properties = {{"LocationID", location}},
-              .hid = std::make_shared<platform::simulated::hid_unit>(),
+              .hid = std::make_shared<platform::simulated::virtual_hid_device>(),
               .records = records});
     return *records;
 }
 
-void put_hid_events(machine& host, scripted_news news) {
+void set_hid_events_script(machine& host, scripted_notifications news) {
     host.set_hid_events(
         [news = std::move(news)] { return std::make_unique<scripted_events>(news); });
 }

@@ -7,8 +7,7 @@
 #include <utility>
 #include <vector>
 
-#include "platform/virtual/hid_event_source.h"
-#include "platform/virtual/record_unit.h"
+#include "platform/virtual/hid_sources.h"
 #include "tests/support/device_test.h"
 
 namespace tests {
@@ -16,14 +15,14 @@ namespace tests {
 using clock_time = platform::simulated::machine_clock::time;
 
 // Records that come at times of the host's clock, while the mode is on. Its mode calls are kept.
-class scripted_records final : public platform::simulated::record_unit {
+class scripted_records final : public platform::simulated::record_source {
 public:
     platform::return_code set_mode(std::int32_t service_id, std::uint32_t mode) override {
         modes.emplace_back(service_id, mode);
         return mode_result;
     }
     [[nodiscard]] std::optional<clock_time> next_due() const override;
-    byte_list take_record() override;
+    byte_list pop_record() override;
 
     std::vector<std::pair<std::int32_t, std::uint32_t>> modes;
     platform::return_code mode_result = platform::success;
@@ -31,11 +30,12 @@ public:
 };
 
 // Registers a HID device with a plug-in at a location.
-scripted_records& put_hid_device(machine& host, std::string_view name, std::int32_t location);
+scripted_records& add_hid_device(machine& host, std::string_view name, std::int32_t location);
 
-using scripted_news = std::deque<std::pair<clock_time, platform::simulated::hid_news>>;
+using scripted_notifications =
+    std::deque<std::pair<clock_time, platform::simulated::hid_notification>>;
 
 // Gives the host an event system that tells each of its clients these news.
-void put_hid_events(machine& host, scripted_news news);
+void set_hid_events_script(machine& host, scripted_notifications news);
 
 }  // namespace tests

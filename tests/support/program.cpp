@@ -6,7 +6,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include "tests/support/word_vector.h"
+#include "tests/support/argument_vector.h"
 
 namespace tests {
 
@@ -23,12 +23,13 @@ pipe_ends make_pipe(int flags = 0) {
     return {ends[0], ends[1]};
 }
 
-// Reads a pipe to its end; each read is one item.
+// Reads a pipe to its end. Each read is one item.
 std::vector<std::string> read_pieces(int descriptor) {
     std::vector<std::string> pieces;
-    std::array<char, 65536> part;
-    for (ssize_t got = 0; (got = ::read(descriptor, part.data(), part.size())) > 0;) {
-        pieces.emplace_back(part.data(), static_cast<std::size_t>(got));
+    std::array<char, 65536> buffer;
+    ssize_t count = 0;
+    while ((count = ::read(descriptor, buffer.data(), buffer.size())) > 0) {
+        pieces.emplace_back(buffer.data(), static_cast<std::size_t>(count));
     }
     ::close(descriptor);
     return pieces;
@@ -47,19 +48,19 @@ int wait_for(pid_t child) {
     return WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
 }
 
-// The descriptor that the program writes to, and the end to read from, if there is one.
-pipe_ends open_target(output_to target) {
+// Opens what the program writes to, and the end to read from if there is one.
+pipe_ends open_target(output_target target) {
     switch (target) {
-        case output_to::pipe:
+        case output_target::pipe:
             return make_pipe();
-        case output_to::closed_pipe: {
+        case output_target::closed_pipe: {
             const pipe_ends ends = make_pipe();
             ::close(ends.read_end);
             return {-1, ends.write_end};
         }
-        case output_to::full_device:
+        case output_target::full_device:
             return {-1, ::open("/dev/full", O_WRONLY | O_CLOEXEC)};
-        case output_to::nowhere:
+        case output_target::closed:
             return {};
     }
     return {};
@@ -69,9 +70,9 @@ pipe_ends open_target(output_to target) {
 
 pid_t start_program(const std::string& path, const std::vector<std::string>& arguments, int out,
                     int err) {
-    std::vector<std::string> words{path};
-    words.insert(words.end(), arguments.begin(), arguments.end());
-    word_vector all(std::move(words));
+    std::vector<std::string> command{path};
+    command.insert(command.end(), arguments.begin(), arguments.end());
+    argument_vector all(std::move(command));
     const pid_t child = ::fork();
     if (child != 0) return child;
     if (out >= 0) {
@@ -85,7 +86,7 @@ pid_t start_program(const std::string& path, const std::vector<std::string>& arg
 }
 
 program_result run_program(const std::string& path, const std::vector<std::string>& arguments,
-                           output_to target) {
+                           output_target target) {
     const pipe_ends out = open_target(target);
     const pipe_ends err = make_pipe();
     const pid_t child = start_program(path, arguments, out.write_end, err.write_end);
@@ -98,8 +99,8 @@ program_result run_program(const std::string& path, const std::vector<std::strin
     return {wait_for(child), text, error_text};
 }
 
-std::vector<std::string> writes_of(const std::string& path,
-                                   const std::vector<std::string>& arguments) {
+std::vector<std::string> record_writes(const std::string& path,
+                                       const std::vector<std::string>& arguments) {
     const pipe_ends out = make_pipe(O_DIRECT);
     const int err = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
     const pid_t child = start_program(path, arguments, out.write_end, err);

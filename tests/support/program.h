@@ -1,4 +1,4 @@
-// Runs a program of the project as a process of its own.
+// Runs a program of the project as a process.
 #pragma once
 
 #include <string>
@@ -14,19 +14,19 @@ struct program_result {
 };
 
 // Where a program's standard output goes.
-enum class output_to { pipe, closed_pipe, full_device, nowhere };
+enum class output_target { pipe, closed_pipe, full_device, closed };
 
-// Starts the program with descriptors for its output; a negative one stands for none. Its process.
+// Starts the program with descriptors for its output; a negative one closes the stream. Returns the
+// process id.
 pid_t start_program(const std::string& path, const std::vector<std::string>& arguments, int out,
                     int err);
 
-// Runs the program to its end with its standard output and standard error kept apart.
+// Runs the program to its end and keeps its standard output and standard error apart.
 program_result run_program(const std::string& path, const std::vector<std::string>& arguments,
-                           output_to target = output_to::pipe);
+                           output_target target = output_target::pipe);
 
-// Runs the program with its standard output in a pipe that keeps each write apart; the writes in
-// order.
-std::vector<std::string> writes_of(const std::string& path,
-                                   const std::vector<std::string>& arguments);
+// Runs the program and returns the writes to its standard output, in order.
+std::vector<std::string> record_writes(const std::string& path,
+                                       const std::vector<std::string>& arguments);
 
 }  // namespace tests

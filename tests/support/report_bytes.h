@@ -1,4 +1,4 @@
-// Report bytes, put together by hand.
+// Report bytes built from their fields.
 #pragma once
 
 #include <cstddef>
@@ -7,7 +7,7 @@
 #include <string_view>
 #include <vector>
 
-#include "nrxctl/printers/report_printer.h"
+#include "nrxctl/printers/report_printers.h"
 #include "tests/support/capture.h"
 
 namespace tests {
@@ -15,34 +15,35 @@ namespace tests {
 // One number, or several.
 class number_list : public std::vector<std::uint64_t> {
 public:
-    number_list(std::uint64_t one) : vector(1, one) {}
+    number_list(std::uint64_t number) : vector(1, number) {}
     number_list(std::initializer_list<std::uint64_t> all) : vector(all) {}
 };
 
-// Little-endian numbers of a report that follow each other.
-struct number_at {
+// Consecutive little-endian numbers of a report.
+struct field_value {
     std::size_t offset;
     std::size_t width;
     number_list values;
 };
 
-// A report of a size with numbers in it, and filler everywhere else: what is not listed must not
-// show.
-std::vector<std::uint8_t> report_with(std::size_t size, std::initializer_list<number_at> numbers,
+// A report of the given size with the given values, and filler everywhere else: bytes that are not
+// listed must not show.
+std::vector<std::uint8_t> report_with(std::size_t size, std::initializer_list<field_value> fields,
                                       std::uint8_t filler = 0xa5);
 
-// Little-endian 32-bit words.
-std::vector<std::uint8_t> words_of(std::initializer_list<std::uint64_t> words);
+// A report of little-endian 32-bit numbers.
+std::vector<std::uint8_t> u32_report(std::initializer_list<std::uint64_t> numbers);
 
 // What a report printer prints.
-outcome printed(nrx::report_printer print, std::string_view service_name, std::int32_t report_id,
+outcome printed(nrx::report_printer print, std::string_view service_name, nrx::report_id id,
                 const std::vector<std::uint8_t>& report);
 
-// Prints every prefix of a report, but the empty one, from its own allocation, so that a byte read
-// beyond the reply is a sanitizer's find: as many lines as the whole report, and a failure report
-// if it is shorter than needed. A longer report prints like the whole one.
-void print_every_prefix(nrx::report_printer print, std::string_view service_name,
-                        std::int32_t report_id, const std::vector<std::uint8_t>& report,
-                        std::size_t needed, std::string_view file);
+// Prints every prefix of a report but the empty one, each from an allocation of its own size, so
+// that a sanitizer finds a read beyond the reply. Expects as many lines as for the whole report,
+// and a failure report if the prefix is shorter than required. A longer report prints like the
+// whole one.
+void print_every_prefix(nrx::report_printer print, std::string_view service_name, nrx::report_id id,
+                        const std::vector<std::uint8_t>& report, std::size_t required,
+                        std::string_view file);
 
 }  // namespace tests

@@ -6,7 +6,7 @@
 
 namespace tests {
 
-// Rows of values that the loop over them gives names to.
+// Rows of values; the loop over them names the columns.
 template <class... Columns>
 using rows = std::vector<std::tuple<Columns...>>;
 

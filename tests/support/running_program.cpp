@@ -41,19 +41,20 @@ running_program::~running_program() {
 }
 
 bool running_program::read_more() {
-    std::array<char, 65536> part;
-    const ssize_t got = ::read(output_, part.data(), part.size());
-    if (got > 0) out_.append(part.data(), static_cast<std::size_t>(got));
-    return got > 0;
+    std::array<char, 65536> buffer;
+    const ssize_t count = ::read(output_, buffer.data(), buffer.size());
+    if (count > 0) out_.append(buffer.data(), static_cast<std::size_t>(count));
+    return count > 0;
 }
 
 bool running_program::wait_for(const std::string& text) {
     const auto deadline = std::chrono::steady_clock::now() + std::chrono::seconds(10);
     while (out_.find(text) == std::string::npos) {
-        const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(
+        const auto remaining = std::chrono::duration_cast<std::chrono::milliseconds>(
             deadline - std::chrono::steady_clock::now());
         pollfd readable{output_, POLLIN, 0};
-        if (left.count() <= 0 || ::poll(&readable, 1, static_cast<int>(left.count())) <= 0)
+        if (remaining.count() <= 0 ||
+            ::poll(&readable, 1, static_cast<int>(remaining.count())) <= 0)
             return false;
         if (!read_more()) return false;
     }
@@ -68,10 +69,10 @@ int running_program::finish() {
     while (read_more()) {
     }
     int status = 0;
-    rusage used{};
-    ::wait4(child_, &status, 0, &used);
+    rusage usage{};
+    ::wait4(child_, &status, 0, &usage);
     child_ = -1;
-    processor_time_ = seconds(used.ru_utime) + seconds(used.ru_stime);
+    processor_time_ = seconds(usage.ru_utime) + seconds(usage.ru_stime);
     return WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
 }
 

@@ -1,4 +1,4 @@
-// A program of the project as a process that a test talks to while it runs.
+// A program of the project as a process that a test interacts with while it runs.
 #pragma once
 
 #include <string>
@@ -9,26 +9,27 @@ namespace tests {
 
 class running_program {
 public:
-    // Starts the program; its standard output comes here, its standard error goes nowhere.
+    // Starts the program. Its standard output is read here; its standard error is discarded.
     running_program(const std::string& path, const std::vector<std::string>& arguments);
-    // Ends it if it still runs.
+    // Kills it if it is still running.
     ~running_program();
     running_program(const running_program&) = delete;
     running_program& operator=(const running_program&) = delete;
 
-    // Reads on until the output holds the text; false if it ends, or 10 seconds pass, before.
+    // Reads until the output contains the text. Returns false if the output ends or 10 seconds
+    // pass before that.
     bool wait_for(const std::string& text);
 
     void send_interrupt() const;
 
-    // Reads the rest of the output and waits for the end. The exit status; 128 + the signal if one
-    // ended it.
+    // Reads the rest of the output and waits for the end. Returns the exit status, or 128 + the
+    // signal that ended the process.
     int finish();
 
     // All output so far.
     [[nodiscard]] const std::string& out() const { return out_; }
 
-    // Processor time that the program used, in seconds, once it has ended.
+    // The processor time that the program used, in seconds. Known after finish().
     [[nodiscard]] double processor_time() const { return processor_time_; }
 
 private:

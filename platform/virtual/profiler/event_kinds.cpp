@@ -1,4 +1,4 @@
-// What each component of the profiler reports, and what stands in it. Layouts by type:
+// The events of each component of the profiler, and the bodies of their records. Layouts by type:
 //
 //    1 long data     16 subtype u16, packet size u16, data length u16, data offset u16, 24 data
 //    2 short data    16 subtype u16, 18 data
@@ -25,129 +25,132 @@ namespace platform::simulated {
 
 namespace {
 
-void put_text(byte_span record, std::size_t offset, std::string_view text) {
+void store_text(byte_span record, std::size_t offset, std::string_view text) {
     std::copy(text.begin(), text.end(), record.begin() + static_cast<std::ptrdiff_t>(offset));
 }
 
-void put_words(byte_span record, const std::array<std::uint64_t, 6>& words) {
+void store_words(byte_span record, const std::array<std::uint64_t, 6>& words) {
     for (std::size_t i = 0; i < words.size(); ++i) {
-        put_le(record, 16 + 4 * i, 4, words[i]);
+        store_le(record, 16 + 4 * i, 4, words[i]);
     }
 }
 
-// A small number that moves with the turn but stays within a range.
-constexpr std::uint64_t within(std::uint64_t turn, std::uint64_t least, std::uint64_t range) {
-    return least + turn * 37 % range;
+// A value from min to min + range - 1 that varies with the number of the event.
+constexpr std::uint64_t vary(std::uint64_t number, std::uint64_t min, std::uint64_t range) {
+    return min + number * 37 % range;
 }
 
-constexpr std::uint64_t thread_address(std::uint64_t turn) {
-    return 0x2000'4000 + 0x180 * (turn % 6);
+constexpr std::uint64_t thread_address(std::uint64_t number) {
+    return 0x2000'4000 + 0x180 * (number % 6);
 }
 
-void long_data(byte_span record, std::uint64_t turn) {
-    constexpr std::size_t most_bytes = 24;
-    const std::uint64_t length = within(turn, 4, most_bytes - 3);
-    put_le(record, 16, 2, turn % 5);
-    put_le(record, 18, 2, length);
-    put_le(record, 20, 2, length);
+void long_data(byte_span record, std::uint64_t number) {
+    constexpr std::size_t max_bytes = 24;
+    const std::uint64_t length = vary(number, 4, max_bytes - 3);
+    store_le(record, 16, 2, number % 5);
+    store_le(record, 18, 2, length);
+    store_le(record, 20, 2, length);
     for (std::size_t i = 0; i < length; ++i) {
-        put_le(record, 24 + i, 1, turn * 3 + i);
+        store_le(record, 24 + i, 1, number * 3 + i);
     }
 }
 
-void short_data(byte_span record, std::uint64_t turn) {
-    put_le(record, 16, 2, turn % 7);
+void short_data(byte_span record, std::uint64_t number) {
+    store_le(record, 16, 2, number % 7);
     for (std::size_t i = 18; i < record.size(); ++i) {
-        put_le(record, i, 1, turn + 5 * i);
+        store_le(record, i, 1, number + 5 * i);
     }
 }
 
-void arguments(byte_span record, std::uint64_t turn) {
-    put_words(record, {turn, thread_address(turn), thread_address(turn + 1), within(turn, 3, 900),
-                       turn % 4, within(turn, 20, 64)});
+void arguments(byte_span record, std::uint64_t number) {
+    store_words(record, {number, thread_address(number), thread_address(number + 1),
+                         vary(number, 3, 900), number % 4, vary(number, 20, 64)});
 }
 
-void trigger(byte_span record, std::uint64_t turn) {
-    put_le(record, 20, 4, thread_address(turn));
+void trigger(byte_span record, std::uint64_t number) {
+    store_le(record, 20, 4, thread_address(number));
 }
 
-void function(byte_span record, std::uint64_t turn) {
-    put_words(record, {0x0800'1000 + 0x24 * (turn % 40), turn % 3, thread_address(turn),
-                       within(turn, 5, 400), turn % 8, within(turn, 400, 9000)});
+void function(byte_span record, std::uint64_t number) {
+    store_words(record, {0x0800'1000 + 0x24 * (number % 40), number % 3, thread_address(number),
+                         vary(number, 5, 400), number % 8, vary(number, 400, 9000)});
 }
 
-void context(byte_span record, std::uint64_t turn) {
-    put_words(record, {0x0800'1000 + 4 * turn, thread_address(turn), turn % 16, turn, 0, 0});
+void context(byte_span record, std::uint64_t number) {
+    store_words(record,
+                {0x0800'1000 + 4 * number, thread_address(number), number % 16, number, 0, 0});
 }
 
-void sensor_info(byte_span record, std::uint64_t turn) {
-    put_words(record, {10'000, 200'000, within(turn, 1, 64), 1'000'000, 0, 0});
-    put_le(record, 32, 1, 1);
-    put_le(record, 33, 1, 1 + turn % 4);
-    put_le(record, 34, 1, turn % 3);
-    put_text(record, 35, "client");
-    put_le(record, 41, 1, '0' + turn % 10);
+void sensor_info(byte_span record, std::uint64_t number) {
+    store_words(record, {10'000, 200'000, vary(number, 1, 64), 1'000'000, 0, 0});
+    store_le(record, 32, 1, 1);
+    store_le(record, 33, 1, 1 + number % 4);
+    store_le(record, 34, 1, number % 3);
+    store_text(record, 35, "client");
+    store_le(record, 41, 1, '0' + number % 10);
 }
 
-void extended_function(byte_span record, std::uint64_t turn) {
-    put_words(record, {1 + turn % 5, thread_address(turn), within(turn, 8, 700), turn, 0, 0});
+void extended_function(byte_span record, std::uint64_t number) {
+    store_words(record,
+                {1 + number % 5, thread_address(number), vary(number, 8, 700), number, 0, 0});
     static constexpr std::array<std::string_view, 3> names{"dispatch_report", "pump_queue",
                                                            "step_filter"};
-    put_text(record, 32, names[turn % names.size()]);
+    store_text(record, 32, names[number % names.size()]);
 }
 
-void annotation(byte_span record, std::uint64_t turn) {
-    put_le(record, 16, 8, 0x1'0000'0000 + turn);
-    put_text(record, 24, "step");
-    put_le(record, 28, 1, 'a' + turn % 26);
-    put_le(record, 32, 4, within(turn, 1, 100));
-    put_le(record, 36, 4, turn % 2);
+void annotation(byte_span record, std::uint64_t number) {
+    store_le(record, 16, 8, 0x1'0000'0000 + number);
+    store_text(record, 24, "step");
+    store_le(record, 28, 1, 'a' + number % 26);
+    store_le(record, 32, 4, vary(number, 1, 100));
+    store_le(record, 36, 4, number % 2);
 }
 
-void decimation(byte_span record, std::uint64_t turn) {
-    put_le(record, 16, 8, 2'500 * turn);
-    put_le(record, 24, 4, 1'250);
-    put_le(record, 28, 4, 10'000);
-    put_le(record, 32, 4, 200'000);
-    put_text(record, 36, "motion");
+void decimation(byte_span record, std::uint64_t number) {
+    store_le(record, 16, 8, 2'500 * number);
+    store_le(record, 24, 4, 1'250);
+    store_le(record, 28, 4, 10'000);
+    store_le(record, 32, 4, 200'000);
+    store_text(record, 36, "motion");
 }
 
-// Samples of the three axes in fixed point: gravity on z, a little movement on x and y.
-void samples(byte_span record, std::uint64_t turn, std::uint64_t one) {
-    const std::uint64_t x = turn % 64 * one / 256;
-    put_words(record, {x, 0 - x / 2, one - one / 128, turn, within(turn, 100, 50), 3});
+// Samples of the three axes in fixed point, in multiples of unit: gravity on z, slight movement on
+// x and y.
+void store_samples(byte_span record, std::uint64_t number, std::uint64_t unit) {
+    const std::uint64_t x = number % 64 * unit / 256;
+    store_words(record, {x, 0 - x / 2, unit - unit / 128, number, vary(number, 100, 50), 3});
 }
 
-void samples_in(byte_span record, std::uint64_t turn) {
-    samples(record, turn, 65'536);
+void samples_in(byte_span record, std::uint64_t number) {
+    store_samples(record, number, 65'536);
 }
 
-void samples_out(byte_span record, std::uint64_t turn) {
-    samples(record, turn, 4'096);
+void samples_out(byte_span record, std::uint64_t number) {
+    store_samples(record, number, 4'096);
 }
 
-// The direction and the bus controller's own time.
-void transfer(byte_span record, std::uint64_t turn) {
-    put_le(record, 16, 4, turn % 2);
-    put_le(record, 20, 8, 24'000 * turn + 17);
+// The direction and the time of the bus controller.
+void transfer(byte_span record, std::uint64_t number) {
+    store_le(record, 16, 4, number % 2);
+    store_le(record, 20, 8, 24'000 * number + 17);
 }
 
-void wake_statistics(byte_span record, std::uint64_t turn) {
-    put_words(record, {turn % 27, turn / 27 + 1, within(turn, 50, 400), 0, 0, 0});
+void wake_statistics(byte_span record, std::uint64_t number) {
+    store_words(record, {number % 27, number / 27 + 1, vary(number, 50, 400), 0, 0, 0});
 }
 
-void wake_request(byte_span record, std::uint64_t turn) {
-    put_le(record, 16, 4, turn % 27);
-    put_le(record, 20, 8, 0xffff'fff0'0000'0000 + 0x40 * (turn % 12));
+void wake_request(byte_span record, std::uint64_t number) {
+    store_le(record, 16, 4, number % 27);
+    store_le(record, 20, 8, 0xffff'fff0'0000'0000 + 0x40 * (number % 12));
 }
 
-void wake_event(byte_span record, std::uint64_t turn) {
-    put_le(record, 16, 4, turn % 27);
-    put_le(record, 20, 4, 0x10 + turn % 8);
+void wake_event(byte_span record, std::uint64_t number) {
+    store_le(record, 16, 4, number % 27);
+    store_le(record, 20, 4, 0x10 + number % 8);
 }
 
 constexpr std::uint32_t any = event_kind::any_component;
-constexpr std::uint32_t always = 0xffffffff;
+constexpr std::uint32_t all_reports = 0xffffffff;
 
 constexpr std::uint32_t bit(unsigned n) {
     return std::uint32_t{1} << n;
@@ -156,12 +159,12 @@ constexpr std::uint32_t bit(unsigned n) {
 // Category, component, report bits; event, type, body.
 constexpr std::array event_table{
     // exec: scheduler, function, workloop, command, extfunction, timing
-    event_kind{0, 0, always, 0, 3, arguments},
-    event_kind{0, 0, always, 1, 3, arguments},
-    event_kind{0, 0, always, 2, 3, arguments},
-    event_kind{0, 1, always, 0, 5, function},
-    event_kind{0, 2, always, 0, 3, arguments},
-    event_kind{0, 2, always, 1, 3, arguments},
+    event_kind{0, 0, all_reports, 0, 3, arguments},
+    event_kind{0, 0, all_reports, 1, 3, arguments},
+    event_kind{0, 0, all_reports, 2, 3, arguments},
+    event_kind{0, 1, all_reports, 0, 5, function},
+    event_kind{0, 2, all_reports, 0, 3, arguments},
+    event_kind{0, 2, all_reports, 1, 3, arguments},
     event_kind{0, 3, bit(0), 0, 3, arguments},
     event_kind{0, 3, bit(1), 1, 3, arguments},
     event_kind{0, 3, bit(2), 2, 1, long_data},
@@ -170,8 +173,8 @@ constexpr std::array event_table{
     event_kind{0, 3, bit(5), 5, 1, long_data},
     event_kind{0, 3, bit(6), 6, 1, long_data},
     event_kind{0, 3, bit(7), 7, 2, short_data},
-    event_kind{0, 4, always, 0, 9, extended_function},
-    event_kind{0, 5, always, 0, 10, context},
+    event_kind{0, 4, all_reports, 0, 9, extended_function},
+    event_kind{0, 5, all_reports, 0, 10, context},
     // trace
     event_kind{1, any, bit(0), 0, 6, context},
     event_kind{1, any, bit(1), 1, 7, context},

@@ -4,6 +4,7 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <deque>
 #include <span>
 #include <vector>
 
@@ -15,41 +16,56 @@ namespace platform::simulated {
 inline constexpr std::size_t event_record_size = 48;
 using event_record = std::array<std::uint8_t, event_record_size>;
 
-// One kind of event: when it is produced, and what its records hold. Bodies vary with turn, the
+// A kind of event: when it is produced, and what its records contain. The bodies vary with the
 // number of the event.
 struct event_kind {
-    // For the component number: whichever component is enabled.
+    // A component number that stands for every component of the category.
     static constexpr std::uint32_t any_component = 0xffffffff;
 
     std::uint32_t category;
     std::uint32_t component;
-    std::uint32_t reports;  // produced if one of these bits is in the component's report mask
+    std::uint32_t reports;  // produced if the component's report mask has one of these bits
     std::uint8_t event;
     std::uint8_t type;
-    void (*fill)(byte_span record, std::uint64_t turn);
+    void (*fill)(byte_span record, std::uint64_t number);
 };
 
-// Every kind of event that there is.
+// All kinds of events.
 extern const std::span<const event_kind> event_kinds;
 
-// The records of one event, at a time of the coprocessor's: mostly one, but a bus transfer is
-// followed by its data. Sequence numbers are taken from sequence_num, which goes up.
+// Creates the records of an event: usually one, but a bus transfer is followed by its data. time is
+// the coprocessor's. Each record takes a sequence number and increments it.
 std::vector<event_record> make_event(const event_kind& kind, std::uint32_t component,
-                                     std::uint64_t turn, machine_clock::time at,
+                                     std::uint64_t number, machine_clock::time time,
                                      std::uint32_t& sequence_num);
 
-// A note of the profiler about itself, as its logs keep them: what happened, and a number with it.
+// What the profiler records about itself in its logs, and the argument of each such record.
 enum class control_event : std::uint8_t {
-    started,     // log opened; number: records kept
-    configured,  // number: configuration records
+    started,
+    configured,  // number of configuration records
     enabled,
     disabled,
     stopped,
     flushed,
-    duration_set,  // number: microseconds
-    dumped,        // number: records in the error dump
+    duration_set,  // microseconds
+    dumped,        // number of records in the error dump
 };
-event_record make_control_record(control_event what, std::uint32_t number, machine_clock::time at,
-                                 std::uint32_t& sequence_num);
+
+event_record make_control_record(control_event event, std::uint32_t argument,
+                                 machine_clock::time time, std::uint32_t& sequence_num);
+
+// A log of event records. Keeps the newest ones; reading removes records.
+class record_log {
+public:
+    static constexpr std::size_t capacity = 1'024;
+
+    void add(const event_record& record);
+
+    // Removes and returns the oldest records, as many as fit into max_bytes.
+    std::vector<std::uint8_t> read(std::size_t max_bytes);
+
+private:
+    std::deque<event_record> records_;
+};
 
 }  // namespace platform::simulated

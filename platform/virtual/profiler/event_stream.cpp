@@ -8,12 +8,12 @@ namespace {
 
 using time = machine_clock::time;
 
-constexpr std::size_t recent_records = 32;
+constexpr std::size_t max_recent_records = 32;
 
-// The first end of a batch, counted from start, that is not before a time.
-time end_of_batch(time start, time at) {
+// The end of the batch that contains the given time; batches are counted from start.
+time end_of_batch(time start, time instant) {
     const time batch = event_stream::batch_interval;
-    return start + (at - start + batch - time(1)) / batch * batch;
+    return start + (instant - start + batch - time(1)) / batch * batch;
 }
 
 }  // namespace
@@ -48,24 +48,24 @@ void event_stream::set_enabled(bool enabled) {
 
 void event_stream::flush() {
     catch_up();
-    if (running()) happen_until(clock_.now());
+    if (running()) emit_until(clock_.now());
 }
 
 void event_stream::end() {
     flush();
-    if (!ended_) mark_end();
+    if (!ended_) add_end_marker();
 }
 
 void event_stream::end_after(std::chrono::microseconds duration) {
     catch_up();
-    end_at_.reset();
-    if (!ended_ && duration.count() > 0) end_at_ = clock_.now() + duration;
+    end_time_.reset();
+    if (!ended_ && duration.count() > 0) end_time_ = clock_.now() + duration;
 }
 
-void event_stream::mark_end() {
+void event_stream::add_end_marker() {
     add(event_record{});
     ended_ = true;
-    end_at_.reset();
+    end_time_.reset();
 }
 
 time event_stream::time_of(std::uint64_t event) const {
@@ -74,60 +74,60 @@ time event_stream::time_of(std::uint64_t event) const {
 
 void event_stream::restart() {
     start_ = clock_.now();
-    events_ = 0;
+    event_count_ = 0;
 }
 
-// Whoever looks long after the queue has filled up does not wait for all that was lost since.
-void event_stream::skip_what_would_be_lost(time horizon) {
-    const auto happened = static_cast<std::uint64_t>((horizon - start_) / period_);
-    if (happened <= events_ + capacity) return;
-    const std::uint64_t skipped = happened - events_ - capacity;
+// Skips events that a full queue would have dropped, so that a reader who looks long afterwards
+// does not have to wait until all of them have been generated.
+void event_stream::skip_dropped_events(time limit) {
+    const auto occurred = static_cast<std::uint64_t>((limit - start_) / period_);
+    if (occurred <= event_count_ + capacity) return;
+    const std::uint64_t skipped = occurred - event_count_ - capacity;
     sequence_num_ += static_cast<std::uint32_t>(skipped);
-    events_ += skipped;
+    event_count_ += skipped;
 }
 
-void event_stream::happen_until(time horizon) {
-    skip_what_would_be_lost(horizon);
-    while (time_of(events_) <= horizon)
-        happen(events_++);
+void event_stream::emit_until(time limit) {
+    skip_dropped_events(limit);
+    while (time_of(event_count_) <= limit)
+        emit(event_count_++);
 }
 
-void event_stream::happen(std::uint64_t event) {
-    const source& from = sources_[event % sources_.size()];
-    const std::uint64_t turn = event / sources_.size();
-    const event_kind& kind = *from.kinds[turn % from.kinds.size()];
+void event_stream::emit(std::uint64_t event) {
+    const source& origin = sources_[event % sources_.size()];
+    const event_kind& kind = *origin.kinds[event / sources_.size() % origin.kinds.size()];
     for (const event_record& record :
-         make_event(kind, from.component, event, time_of(event), sequence_num_)) {
+         make_event(kind, origin.component, event, time_of(event), sequence_num_)) {
         if (size() < capacity) add(record);
         recent_.push_back(record);
-        if (recent_.size() > recent_records) recent_.pop_front();
+        if (recent_.size() > max_recent_records) recent_.pop_front();
     }
 }
 
 void event_stream::catch_up() {
     const time now = clock_.now();
-    const bool over = end_at_ && *end_at_ <= now;
+    const bool ends = end_time_ && *end_time_ <= now;
     if (running()) {
         const time batch = batch_interval;
-        happen_until(over ? *end_at_ : start_ + (now - start_) / batch * batch);
+        emit_until(ends ? *end_time_ : start_ + (now - start_) / batch * batch);
     }
-    if (over) mark_end();
+    if (ends) add_end_marker();
 }
 
 std::optional<time> event_stream::next_due() const {
-    std::optional<time> due = end_at_;
+    std::optional<time> due = end_time_;
     if (running()) {
-        const time batch = end_of_batch(start_, time_of(events_));
+        const time batch = end_of_batch(start_, time_of(event_count_));
         due = due ? std::min(*due, batch) : batch;
     }
     return due;
 }
 
-void event_stream::unmapped() {
+void event_stream::on_unmapped() {
     catch_up();
     clear();
     ended_ = false;
-    end_at_.reset();
+    end_time_.reset();
     restart();
 }
 

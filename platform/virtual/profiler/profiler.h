@@ -1,4 +1,4 @@
-// The virtual profiler: what its two halves, the kernel's driver and the coprocessor, share.
+// The virtual profiler. It has two halves: the kernel's driver and the coprocessor.
 #pragma once
 
 #include <chrono>
@@ -8,18 +8,18 @@
 #include "platform/return_code.h"
 #include "platform/virtual/interface_driver.h"
 #include "platform/virtual/machine.h"
+#include "platform/virtual/profiler/event_record.h"
 #include "platform/virtual/profiler/event_stream.h"
-#include "platform/virtual/profiler/profiler_half.h"
+#include "platform/virtual/profiler/profiler_config.h"
 #include "platform/virtual/profiler/profiler_statistics.h"
-#include "platform/virtual/profiler/record_log.h"
 
 namespace platform::simulated {
 
-// Each half keeps its own configuration and its own log; a component that either half has enabled
-// produces events. What is done to a half is noted in its log.
+// Each half has a configuration of its own and logs the operations on it. A component produces
+// events if either half has enabled it.
 class profiler {
 public:
-    // The clock outlives the profiler.
+    // The clock must outlive the profiler.
     explicit profiler(const machine_clock& clock);
 
     [[nodiscard]] const std::shared_ptr<event_stream>& stream() const { return stream_; }
@@ -29,14 +29,14 @@ public:
 
     void set_enabled(bool enabled);
     return_code configure_kernel(byte_view records);
-    [[nodiscard]] byte_list kernel_configs(std::size_t room) const;
+    [[nodiscard]] byte_list kernel_configs(std::size_t capacity) const;
 
-    // Copies the last records of the stream into the error dump.
+    // Copies the most recent records of the stream to the error dump.
     void dump_errors();
 
-    // The oldest records, which are taken out.
-    byte_list take_kernel_log(std::size_t room) { return kernel_log_.take(room); }
-    byte_list take_error_dump(std::size_t room) { return error_dump_.take(room); }
+    // Remove and return the oldest records.
+    byte_list read_kernel_log(std::size_t capacity) { return kernel_log_.read(capacity); }
+    byte_list read_error_dump(std::size_t capacity) { return error_dump_.read(capacity); }
 
     // Ends the stream.
     void stop_stream() { stream_->end(); }
@@ -44,37 +44,37 @@ public:
     // --- the coprocessor's half ---
 
     return_code configure_coprocessor(byte_view records);
-    [[nodiscard]] byte_list coprocessor_configs(std::size_t room) const;
-    byte_list take_coprocessor_log(std::size_t room) { return coprocessor_log_.take(room); }
+    [[nodiscard]] byte_list coprocessor_configs(std::size_t capacity) const;
+    byte_list read_coprocessor_log(std::size_t capacity) { return coprocessor_log_.read(capacity); }
 
-    // Disables all that the coprocessor profiles.
+    // Disables all components of the coprocessor.
     void stop_coprocessor();
 
-    // Hands over what has happened at once.
+    // Delivers the events that have occurred so far.
     void flush();
 
-    // Ends the stream after a time from now; 0: it has no end.
+    // Ends the stream after the given duration; 0 means no end.
     void set_duration(std::chrono::microseconds duration);
 
 private:
-    void note(record_log& log, control_event what, std::uint32_t number = 0);
+    void log_event(record_log& log, control_event event, std::uint32_t argument = 0);
     return_code configure(profiler_half& half, record_log& log, byte_view records);
     void update_sources();
 
     const machine_clock& clock_;
     std::shared_ptr<event_stream> stream_;
     profiler_statistics statistics_;
-    profiler_half kernel_{kernel_abilities};
-    profiler_half coprocessor_{coprocessor_abilities};
+    profiler_half kernel_{kernel_capabilities};
+    profiler_half coprocessor_{coprocessor_capabilities};
     record_log kernel_log_;
     record_log coprocessor_log_;
     record_log error_dump_;
 };
 
-// Registers the kernel's driver of a new profiler.
+// Creates a profiler and registers the driver of its kernel half.
 std::shared_ptr<profiler> add_profiler_driver(machine& host);
 
-// Lets the interface service "profile" answer for the coprocessor's half.
+// Adds the reports and commands of the coprocessor's half to the interface service "profile".
 void serve_profile(interface_driver& service, const std::shared_ptr<profiler>& shared);
 
 }  // namespace platform::simulated

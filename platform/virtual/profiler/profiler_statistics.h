@@ -1,4 +1,4 @@
-// The statistics that the coprocessor keeps: they grow with the time.
+// The statistics of the coprocessor, which grow over time.
 #pragma once
 
 #include <cstdint>
@@ -10,14 +10,14 @@ namespace platform::simulated {
 
 class profiler_statistics {
 public:
-    // The clock outlives the statistics.
+    // The clock must outlive the statistics.
     explicit profiler_statistics(const machine_clock& clock) : clock_(clock) {}
 
-    // Lets the event sources count from 0.
+    // Resets the counts of the event sources.
     void clear_event_sources() { cleared_ = clock_.now(); }
 
     // Rows of 64 bytes: thread name, 36 bytes; event source, function, context, count, total time,
-    // longest time and longest latency in microseconds, 32 bits each.
+    // maximum time and maximum latency in microseconds, 32 bits each.
     [[nodiscard]] std::vector<std::uint8_t> event_sources() const;
 
     // A 32-bit count of wake requests for every wake reason.

@@ -1,5 +1,5 @@
-// What the HID event system has to tell: each kind of news in a rhythm of its own, handed over a
-// little after it happened.
+// The HID event system: each kind of notification occurs at regular intervals and is delivered a
+// little later.
 
 #include <array>
 #include <chrono>
@@ -20,25 +20,25 @@ using time = machine_clock::time;
 using std::chrono::microseconds;
 using std::chrono::milliseconds;
 
-// The n-th news of a kind: what happened, in ticks at the given instant.
-using make_news = hid_news (*)(std::uint64_t ticks, std::uint64_t n);
+// Makes the n-th notification of a kind, which occurs at the given time.
+using make_notification = hid_notification (*)(std::uint64_t ticks, std::uint64_t n);
 
 struct kind_row {
     milliseconds first;
-    milliseconds every;
+    milliseconds interval;
     microseconds latency;
-    make_news make;
-    std::uint64_t late_one = 0;  // one in so many happens late; 0: none
+    make_notification make;
+    std::uint64_t late_every = 0;  // every late_every-th occurs late; 0: none
 };
 
-constexpr milliseconds lateness{150};
+constexpr milliseconds delay{150};
 
-hid_news make_null(std::uint64_t ticks, std::uint64_t /*n*/) {
+hid_notification make_null(std::uint64_t ticks, std::uint64_t /*n*/) {
     return hid_event{.ticks = ticks, .type = null_event};
 }
 
-// A wrist that swings once in two seconds, in gravity's field.
-hid_news make_acceleration(std::uint64_t ticks, std::uint64_t n) {
+// A wrist that swings every two seconds.
+hid_notification make_acceleration(std::uint64_t ticks, std::uint64_t n) {
     constexpr double samples_per_swing = 10;
     constexpr double pi = 3.14159265358979;
     const double phase = 2 * pi * static_cast<double>(n) / samples_per_swing;
@@ -48,13 +48,13 @@ hid_news make_acceleration(std::uint64_t ticks, std::uint64_t n) {
         .integers = {{accelerometer_type, 1},
                      {accelerometer_subtype, 0},
                      {accelerometer_sequence, static_cast<std::int64_t>(n)}},
-        .fractions = {{accelerometer_x, 0.125 * std::sin(phase)},
-                      {accelerometer_y, 0.0625 * std::cos(phase)},
-                      {accelerometer_z, -0.984375}},
+        .reals = {{accelerometer_x, 0.125 * std::sin(phase)},
+                  {accelerometer_y, 0.0625 * std::cos(phase)},
+                  {accelerometer_z, -0.984375}},
     };
 }
 
-hid_news make_vendor_event(std::uint64_t ticks, std::uint64_t n) {
+hid_notification make_vendor_event(std::uint64_t ticks, std::uint64_t n) {
     static constexpr std::array<std::string_view, 4> texts{"scan idle", "scan lo-fi",
                                                            "button armed", "heartbeat"};
     const std::string_view text = texts[n % texts.size()];
@@ -65,12 +65,12 @@ hid_news make_vendor_event(std::uint64_t ticks, std::uint64_t n) {
 }
 
 // Button down, button up.
-hid_news make_button_event(std::uint64_t ticks, std::uint64_t /*n*/) {
+hid_notification make_button_event(std::uint64_t ticks, std::uint64_t /*n*/) {
     constexpr std::uint32_t button_event = 2;
     return hid_event{.ticks = ticks, .type = button_event};
 }
 
-hid_news make_reset(std::uint64_t /*ticks*/, std::uint64_t /*n*/) {
+hid_notification make_reset(std::uint64_t /*ticks*/, std::uint64_t /*n*/) {
     return hid_reset{};
 }
 
@@ -80,17 +80,17 @@ struct statistics_row {
     std::int32_t value;
 };
 
-// A press of the button, as the firmware counts it.
+// A press of the button in the statistics of the firmware.
 constexpr std::array statistics_rows{
-    statistics_row{3, 0, 1},                       // one click more
-    statistics_row{2, 1, 42},                      // single clicks
-    statistics_row{6, 11, 7'733'248},              // how long it lasted: 118.0
-    statistics_row{5, 24, fixed_point(12.40625)},  // proximity signal
-    statistics_row{1, 19, 0},                      // time-outs are forgotten
+    statistics_row{3, 0, 1},                  // one more click
+    statistics_row{2, 1, 42},                 // single clicks
+    statistics_row{6, 11, 7'733'248},         // duration: 118.0
+    statistics_row{5, 24, q16_16(12.40625)},  // proximity signal
+    statistics_row{1, 19, 0},                 // time-outs are reset
     statistics_row{0, 57, 0},
 };
 
-hid_news make_statistics(std::uint64_t /*ticks*/, std::uint64_t n) {
+hid_notification make_statistics(std::uint64_t /*ticks*/, std::uint64_t n) {
     constexpr std::size_t record_size = 7;
     constexpr std::size_t rows_per_update = 3;
     statistics_update records(rows_per_update * record_size);
@@ -100,7 +100,7 @@ hid_news make_statistics(std::uint64_t /*ticks*/, std::uint64_t n) {
         const auto record = byte_span(records).subspan(i * record_size, record_size);
         record[1] = row.operation;
         record[2] = row.key;
-        put_le(record, 3, sizeof(row.value), static_cast<std::uint32_t>(row.value));
+        store_le(record, 3, sizeof(row.value), static_cast<std::uint32_t>(row.value));
     }
     return records;
 }
@@ -120,41 +120,41 @@ public:
 
     [[nodiscard]] std::optional<time> next_due() const override {
         const std::size_t next = next_kind();
-        return happens_at(next) + kind_rows[next].latency;
+        return time_of(next) + kind_rows[next].latency;
     }
 
-    hid_news take_news() override {
+    hid_notification pop_notification() override {
         const std::size_t next = next_kind();
-        const auto ticks = std::chrono::duration<double>(happens_at(next)).count() / tick_period();
-        hid_news news = kind_rows[next].make(static_cast<std::uint64_t>(ticks), made_[next]);
-        if (auto* event = std::get_if<hid_event>(&news)) {
+        const auto ticks = std::chrono::duration<double>(time_of(next)).count() / tick_period();
+        hid_notification notification =
+            kind_rows[next].make(static_cast<std::uint64_t>(ticks), made_[next]);
+        if (auto* event = std::get_if<hid_event>(&notification)) {
             event->latency_nanoseconds = time(kind_rows[next].latency).count();
         }
         ++made_[next];
-        return news;
+        return notification;
     }
 
 private:
-    [[nodiscard]] time happens_at(std::size_t kind) const {
+    [[nodiscard]] time time_of(std::size_t kind) const {
         const kind_row& row = kind_rows[kind];
         const std::uint64_t n = made_[kind];
-        const bool is_late = row.late_one != 0 && n % row.late_one == row.late_one - 1;
-        return start_ + row.first + static_cast<time::rep>(n) * time(row.every) +
-               (is_late ? time(lateness) : time(0));
+        const bool is_late = row.late_every != 0 && n % row.late_every == row.late_every - 1;
+        return start_ + row.first + static_cast<time::rep>(n) * time(row.interval) +
+               (is_late ? time(delay) : time(0));
     }
 
     [[nodiscard]] std::size_t next_kind() const {
         std::size_t next = 0;
         for (std::size_t kind = 1; kind < kind_rows.size(); ++kind) {
-            if (happens_at(kind) + kind_rows[kind].latency <
-                happens_at(next) + kind_rows[next].latency)
+            if (time_of(kind) + kind_rows[kind].latency < time_of(next) + kind_rows[next].latency)
                 next = kind;
         }
         return next;
     }
 
     const time start_;
-    std::array<std::uint64_t, kind_rows.size()> made_{};  // of each kind
+    std::array<std::uint64_t, kind_rows.size()> made_{};  // number of each kind
 };
 
 }  // namespace

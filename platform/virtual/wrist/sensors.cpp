@@ -1,11 +1,10 @@
-// What the sensors tell about themselves: parts, rates, modes, calibration, ranges.
+// What sensors report about themselves: parts, rates, modes, calibration, ranges.
 
 #include <array>
 #include <cstddef>
 
 #include "platform/virtual/wrist/parts.h"
 #include "platform/virtual/wrist/report_table.h"
-#include "platform/virtual/wrist/services.h"
 
 namespace platform::simulated {
 
@@ -14,7 +13,7 @@ namespace {
 enum class sensor_mode { normal, raw, factory };
 enum class calibration_source { uncalibrated, built_in, system };
 
-// How many samples are gathered where, as intervals in microseconds, and how many of them wait.
+// Batch intervals at each stage in microseconds, and the number of samples that are waiting.
 struct batching {
     std::int64_t sensor;
     std::int64_t mux;
@@ -25,13 +24,13 @@ struct batching {
 
 struct sensor_row {
     std::string_view service;
-    std::string_view vendor;  // at most 31 characters, as the model
+    std::string_view vendor;  // vendor and model: at most 31 characters
     std::string_view model;
-    char place;  // on the board; 0: it does not matter
+    char place;  // on the board; 0: irrelevant
     std::int64_t alternate;
     std::int64_t interval;       // between samples, microseconds
-    std::int64_t part_interval;  // that of the part itself; samples between are left out
-    std::int64_t tick_interval;  // of the system ticks that it gives; -1: none
+    std::int64_t part_interval;  // of the part itself; samples in between are dropped
+    std::int64_t tick_interval;  // between system ticks; -1: none
     bool filter;
     bool fixed_rate;
     batching batched;
@@ -146,30 +145,30 @@ using text_report = report_bytes<32>;
 
 constexpr word_report word(std::int64_t value) {
     word_report bytes{};
-    put_number(bytes, 0, 4, value);
+    store_number(bytes, 0, 4, value);
     return bytes;
 }
 
 constexpr text_report text(std::string_view text) {
     text_report bytes{};
-    put_text(bytes, 0, bytes.size(), text);
+    store_text(bytes, 0, bytes.size(), text);
     return bytes;
 }
 
 constexpr report_bytes<5> location(char place, std::int64_t alternate) {
     report_bytes<5> bytes{};
-    put_number(bytes, 0, 1, place);
-    put_number(bytes, 1, 4, alternate);
+    store_number(bytes, 0, 1, place);
+    store_number(bytes, 1, 4, alternate);
     return bytes;
 }
 
 constexpr report_bytes<20> pack(const batching& batched) {
     report_bytes<20> bytes{};
-    put_number(bytes, 0, 4, batched.sensor);
-    put_number(bytes, 4, 4, batched.mux);
-    put_number(bytes, 8, 4, batched.processor);
-    put_number(bytes, 12, 4, batched.report);
-    put_number(bytes, 16, 4, batched.waiting);
+    store_number(bytes, 0, 4, batched.sensor);
+    store_number(bytes, 4, 4, batched.mux);
+    store_number(bytes, 8, 4, batched.processor);
+    store_number(bytes, 12, 4, batched.report);
+    store_number(bytes, 16, 4, batched.waiting);
     return bytes;
 }
 
@@ -216,7 +215,7 @@ consteval packed_sensor pack(const sensor_row& row) {
     };
     for (const std::int64_t interval : row.intervals) {
         if (interval == 0) continue;
-        put_number(packed.intervals, packed.intervals_length, 4, interval);
+        store_number(packed.intervals, packed.intervals_length, 4, interval);
         packed.intervals_length += 4;
     }
     return packed;
@@ -231,7 +230,8 @@ consteval std::array<packed_sensor, sensors.size()> pack_all() {
 
 constexpr auto packed_sensors = pack_all();
 
-void put_sensor(const machine& device, std::string_view service, const packed_sensor& sensor) {
+void add_sensor_reports(const machine& device, std::string_view service,
+                        const packed_sensor& sensor) {
     const std::array reports{
         service_report{service, 0x00, sensor.interval},
         service_report{service, 0x33, sensor.part_interval},
@@ -250,10 +250,10 @@ void put_sensor(const machine& device, std::string_view service, const packed_se
         service_report{service, 0x3d, sensor.calibrated},
         service_report{service, 0x44, sensor.location},
     };
-    put_reports(device, reports);
+    add_reports(device, reports);
 }
 
-// --- what only the motion sensors have ---
+// --- motion sensors ---
 
 using row_of_three = std::array<double, 3>;
 
@@ -262,7 +262,7 @@ consteval report_bytes<36> matrix(row_of_three x, row_of_three y, row_of_three z
     std::size_t offset = 0;
     for (const row_of_three& row : {x, y, z}) {
         for (const double value : row) {
-            put_number(bytes, offset, 4, fixed_point(value));
+            store_number(bytes, offset, 4, q16_16(value));
             offset += 4;
         }
     }
@@ -289,17 +289,16 @@ consteval report_bytes<12> numbers(std::int64_t x, std::int64_t y, std::int64_t 
 constexpr auto accel_offset = numbers(-214, 97, 1'310);
 constexpr auto gyro_offset = numbers(18, -7, -31);
 constexpr auto compass_offset = numbers(-4'120, 2'986, 655);
-constexpr auto compass_compensation =
-    numbers(fixed_point(-1.25), fixed_point(0.5), fixed_point(2.125));
+constexpr auto compass_compensation = numbers(q16_16(-1.25), q16_16(0.5), q16_16(2.125));
 
 consteval report_bytes<9> axes(std::array<std::int64_t, 9> signs) {
     report_bytes<9> bytes{};
     for (std::size_t i = 0; i < signs.size(); ++i)
-        put_number(bytes, i, 1, signs[i]);
+        store_number(bytes, i, 1, signs[i]);
     return bytes;
 }
 
-// Accelerometer and gyroscope are one part; the magnetometer stands beside it, the other way up.
+// Accelerometer and gyroscope are one part. The magnetometer is mounted upside down.
 constexpr auto inertial_axes = axes({0, -1, 0, 1, 0, 0, 0, 0, 1});
 constexpr auto compass_axes = axes({1, 0, 0, 0, -1, 0, 0, 0, -1});
 
@@ -307,11 +306,11 @@ template <std::size_t Count>
 consteval report_bytes<4 * Count> list(const std::int64_t (&values)[Count]) {
     report_bytes<4 * Count> bytes{};
     for (std::size_t i = 0; i < Count; ++i)
-        put_number(bytes, 4 * i, 4, values[i]);
+        store_number(bytes, 4 * i, 4, values[i]);
     return bytes;
 }
 
-// Multiples of the earth's acceleration, degrees per second; Hz, where 0 is automatic.
+// Ranges in g and degrees per second; bandwidths in Hz, 0 means automatic.
 constexpr auto accel_range = word(8);
 constexpr auto accel_ranges = list({2, 4, 8, 16, 32});
 constexpr auto accel_bandwidth = word(50);
@@ -343,8 +342,8 @@ constexpr std::array motion_reports{
 
 void add_sensors(machine& device) {
     for (std::size_t i = 0; i < sensors.size(); ++i)
-        put_sensor(device, sensors[i].service, packed_sensors[i]);
-    put_reports(device, motion_reports);
+        add_sensor_reports(device, sensors[i].service, packed_sensors[i]);
+    add_reports(device, motion_reports);
 }
 
 }  // namespace platform::simulated

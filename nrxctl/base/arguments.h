@@ -1,0 +1,57 @@
+// Command-line arguments: a cursor over them, tables of keywords, and how an argument is refused.
+#pragma once
+
+#include <algorithm>
+#include <cstddef>
+#include <optional>
+#include <span>
+#include <string_view>
+
+namespace nrx {
+
+// Reads the arguments after an option, one by one.
+class argument_cursor {
+public:
+    // Takes the whole command line and the option parser's index, which is the position of the next
+    // argument. The index advances with each argument read. Both must outlive this object.
+    argument_cursor(std::span<char* const> arguments, int& index)
+        : arguments_(arguments), index_(index) {}
+
+    // Returns the next argument and advances; nullopt at the end.
+    std::optional<std::string_view> next();
+
+    // The number of arguments still to be read.
+    [[nodiscard]] std::size_t remaining() const;
+
+    // Puts an argument in front of the remaining ones, such as the option's own.
+    void prepend(std::string_view argument) { prepended_ = argument; }
+
+private:
+    std::span<char* const> arguments_;
+    int& index_;
+    std::optional<std::string_view> prepended_;
+};
+
+// Returns the row of a table whose member `keyword` equals the argument, or null if there is none.
+template <class Table>
+auto find_keyword(const Table& table, std::string_view argument) -> decltype(table.data()) {
+    const auto match = std::find_if(table.begin(), table.end(),
+                                    [&](const auto& row) { return row.keyword == argument; });
+    return match == table.end() ? nullptr : &*match;
+}
+
+// A subcommand of a command family.
+struct subcommand_row {
+    std::string_view keyword;
+    // Reads its own arguments and reports its own failures.
+    void (*run)(argument_cursor& arguments);
+};
+
+// Runs the subcommand with that keyword. Returns false if the table has none.
+bool run_subcommand(std::span<const subcommand_row> table, std::string_view keyword,
+                    argument_cursor& arguments);
+
+// Prints "message (argument)" as a line on standard output and ends the process with status 1.
+[[noreturn]] void reject_argument(std::string_view message, std::string_view argument);
+
+}  // namespace nrx

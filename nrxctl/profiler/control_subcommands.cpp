@@ -1,0 +1,96 @@
+#include <vector>
+
+#include "nrxctl/base/check.h"
+#include "nrxctl/base/output.h"
+#include "nrxctl/decoders/record_text.h"
+#include "nrxctl/profiler/apply_configs.h"
+#include "nrxctl/profiler/config_parser.h"
+#include "nrxctl/profiler/fw_profiler.h"
+#include "nrxctl/profiler/kernel_profiler.h"
+#include "nrxctl/profiler/monitor.h"
+#include "nrxctl/profiler/subcommands.h"
+
+namespace nrx::profile {
+
+namespace {
+
+void print_configs(std::span<const profiler_config> configs) {
+    for (const profiler_config& config : configs)
+        print_profiler_config(config);
+}
+
+void print_active_configs(std::span<const profiler_config> configs) {
+    if (configs.empty()) print_line("    none");
+    print_configs(configs);
+}
+
+}  // namespace
+
+void enable(argument_cursor& /*arguments*/) {
+    set_profiler_enabled(true);
+}
+
+void disable(argument_cursor& /*arguments*/) {
+    set_profiler_enabled(false);
+}
+
+void stop(argument_cursor& /*arguments*/) {
+    if (fw_profiler_available()) stop_fw_profiler();
+}
+
+void flush(argument_cursor& /*arguments*/) {
+    if (!fw_profiler_available()) return;
+    const platform::return_code kr = flush_fw_profiler();
+    check_success(kr, condition::kr_is_zero);
+}
+
+void configure(argument_cursor& arguments) {
+    std::vector<profiler_config> configs;
+    bool success = parse_profiler_configs(arguments, configs);
+    if (!check(success, condition::success)) return;
+    print_configs(configs);
+    success = apply_profiler_configs(configs);
+    check(success, condition::success);
+}
+
+void show_configs(argument_cursor& /*arguments*/) {
+    profiler_conn conn;
+    bool success = conn.open();
+    if (!check(success, condition::success)) return;
+    bool connected = false;
+    success = get_profiler_status(connected);
+    if (!check(success, condition::success)) return;
+    print_line(connected ? "A client is connected" : "No client is connected");
+    print_line("\nActive components in kext:");
+    print_active_configs(read_kernel_configs(conn));
+    print_line("\nActive components in fw:");
+    if (fw_profiler_available()) {
+        print_active_configs(read_fw_configs());
+    } else {
+        print_line("    fw profiler is not available");
+    }
+}
+
+void monitor(argument_cursor& arguments) {
+    const monitor_args args = parse_monitor_args(arguments);
+    monitor_profiler(args.duration, select_record_printer(args.human));
+}
+
+void run_profile(argument_cursor& arguments) {
+    const monitor_args args = parse_monitor_args(arguments);
+    std::vector<profiler_config> configs;
+    bool success = parse_profiler_configs(arguments, configs);
+    if (!check(success, condition::success)) return;
+    success = apply_profiler_configs(configs);
+    if (!check(success, condition::success)) return;
+    success = set_profiler_enabled(true);
+    if (!check(success, condition::success)) return;
+    success = monitor_profiler(args.duration, select_record_printer(args.human));
+    if (!check(success, condition::success)) return;
+    for (profiler_config& config : configs)
+        config.state = profiler_state::disable;
+    apply_profiler_configs(configs);
+    set_profiler_enabled(false);
+}
+
+}  // namespace nrx::profile

@@ -1,0 +1,177 @@
+#include "nrxctl/replay/load_samples.h"
+
+#include <algorithm>
+#include <array>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "nrxctl/base/check.h"
+#include "nrxctl/base/little_endian.h"
+#include "nrxctl/base/output.h"
+#include "nrxctl/base/service_conn.h"
+#include "nrxctl/base/services.h"
+#include "nrxctl/base/text_line.h"
+#include "nrxctl/replay/replay_state.h"
+#include "nrxctl/replay/sample_file.h"
+
+namespace nrx::replay {
+
+namespace {
+
+// Methods of the replay application's driver. Loading takes a header and records, unloading a
+// service id.
+constexpr std::uint32_t load_method = 0;
+constexpr std::uint32_t unload_method = 1;
+
+platform::return_code call_app(const service_conn& conn, std::uint32_t method,
+                               const std::vector<std::uint8_t>& request) {
+    platform::call_outputs no_outputs;
+    return platform::call(conn.connection(), method, {{}, request}, no_outputs);
+}
+
+// Prints "Service NAME" and then the message, which begins with a space.
+void print_service_message(std::string_view service, std::string_view message) {
+    print_line(text_line().text("Service ").text(service).text(message).view());
+}
+
+// Arguments of load, and what they mean in the header.
+
+struct option_row {
+    std::string_view keyword;
+    std::uint32_t value;
+};
+
+constexpr std::array completions{
+    option_row{"default", 0},
+    option_row{"periodic", 1},
+    option_row{"stop", 2},
+    option_row{"last", 3},
+};
+constexpr std::array locations{
+    option_row{"dram", 1},
+    option_row{"sram", 2},
+    option_row{"local", 2},
+};
+
+// Stores the value of an argument; leaves the default if there is no argument. Returns false after
+// "message: argument" as a line if the argument is unknown.
+bool read_option(std::optional<std::string_view> argument, std::span<const option_row> table,
+                 std::string_view message, std::uint32_t& value) {
+    if (!argument) return true;
+    const option_row* row = find_keyword(table, *argument);
+    if (row == nullptr) {
+        print_line(text_line().text(message).text(": ").text(*argument).view());
+        return false;
+    }
+    value = row->value;
+    return true;
+}
+
+bool read_options(argument_cursor& arguments, replay_load_header& header) {
+    auto argument = arguments.next();
+    if (argument == "filter") {
+        header.filter = 1;
+        argument = arguments.next();
+    }
+    return read_option(argument, completions, "Invalid completion", header.completion) &&
+           read_option(arguments.next(), locations, "Invalid location", header.location);
+}
+
+// The outcome of a step of a load. A step that is stopped by a message is not a failure.
+enum class progress { good, stopped, failed };
+
+// Checks that a service accepts samples.
+progress check_service(const std::string& name) {
+    const auto entries = replay_status();
+    service_id id = 0;
+    const bool resolved = resolve_service_id(name, id);
+    const auto entry = std::find_if(entries.begin(), entries.end(),
+                                    [&](const auto& row) { return row.service_id == id; });
+    const bool success = resolved && entry != entries.end();
+    if (!check(success, condition::success)) return progress::failed;
+    if (entry->state == replay_state::inactive) return progress::good;
+    print_service_message(name, " had already samples; you have to unload first");
+    return progress::stopped;
+}
+
+std::vector<std::uint8_t> make_request(replay_load_header header, const event_list& events) {
+    std::size_t byte_count = 0;
+    for (const event_ptr& event : events)
+        byte_count += event->size();
+    header.byte_count = static_cast<std::uint32_t>(byte_count);
+    std::vector<std::uint8_t> request;
+    append_words(request, {static_cast<std::uint32_t>(header.service_id), header.completion,
+                           header.location, header.filter, header.byte_count});
+    request.reserve(request.size() + byte_count);
+    for (const event_ptr& event : events)
+        request.insert(request.end(), event->data(), event->data() + event->size());
+    return request;
+}
+
+progress upload(replay_load_header header, const event_list& events) {
+    const std::string name = events.front()->name();
+    bool success = resolve_service_id(name, header.service_id);
+    if (!check(success, condition::success)) return progress::failed;
+    const auto request = make_request(header, events);
+    service_conn conn(replay_app_name);
+    success = conn.open();
+    if (!check(success, condition::success)) return progress::failed;
+    const platform::return_code kr = call_app(conn, load_method, request);
+    if (!check_success(kr, condition::kr_is_zero)) return progress::failed;
+    text_line line;
+    line.text(name).text(": loaded ").number(events.size()).text(" events");
+    print_line(line.view());
+    return progress::good;
+}
+
+// Checks every service of the file before it uploads the first, so that a file is rejected as a
+// whole.
+progress load_file(const std::string& path, const replay_load_header& header) {
+    const auto groups = read_sample_file(path);
+    const bool success = groups.has_value();
+    if (!check(success, condition::success)) return progress::failed;
+    progress state = progress::good;
+    for (auto group = groups->begin(); group != groups->end() && state == progress::good; ++group)
+        state = check_service(group->first);
+    for (auto group = groups->begin(); group != groups->end() && state == progress::good; ++group)
+        state = upload(header, group->second);
+    return state;
+}
+
+void unload_service(const service_conn& conn, std::string_view service) {
+    service_id id = 0;
+    if (!resolve_service_id(service, id)) {
+        print_service_message(service, " not found");
+        return;
+    }
+    std::vector<std::uint8_t> request;
+    append_words(request, {static_cast<std::uint32_t>(id)});
+    if (call_app(conn, unload_method, request) != platform::success)
+        print_service_message(service, " can't be unloaded");
+}
+
+}  // namespace
+
+void load(argument_cursor& arguments) {
+    if (!is_enabled()) return;
+    const auto path = arguments.next();
+    if (!check(path, condition::arguments_remain)) return;
+    replay_load_header header{};
+    if (!read_options(arguments, header)) return;
+    const bool success = load_file(std::string(*path), header) != progress::failed;
+    check(success, condition::success);
+}
+
+void unload(argument_cursor& arguments) {
+    auto service = arguments.next();
+    if (!check(service, condition::arguments_remain)) return;
+    if (!is_enabled()) return;
+    service_conn conn(replay_app_name);
+    const bool success = conn.open();
+    if (!check(success, condition::success)) return;
+    for (; service; service = arguments.next())
+        unload_service(conn, *service);
+}
+
+}  // namespace nrx::replay
