@@ -152,15 +152,6 @@ protected:
     platform::byte_span none;
 };
 
-TEST_F(command_channel, refused_report_leaves_the_buffer_unchanged) {
-    EXPECT_EQ(report_of(platform::unsupported, [&] { return nrx::get_report("31", 1, reply); }),
-              unsupported_call);
-    EXPECT_EQ(
-        report_of(platform::unsupported, [] { return nrx::set_report("31", 1, byte_list{1}); }),
-        unsupported_call);
-    EXPECT_EQ(reply.size(), buffer.size());
-}
-
 TEST_F(command_channel, probing_reports_only_a_failed_open) {
     EXPECT_EQ(probe(platform::unsupported), "");
     EXPECT_EQ(reply.size(), buffer.size());

@@ -69,14 +69,6 @@ TEST_F(mca, first_failed_step_ends_the_sequence_and_is_reported_twice) {
     }
 }
 
-TEST_F(mca, missing_service_is_reported_twice) {
-    for (const bool on : {true, false}) {
-        EXPECT_EQ(switch_mca(on, platform::not_found),
-                  library_report(source_file::channel, "service") +
-                      library_report(source_file::mca, "kr == 0 ", not_found_text));
-    }
-}
-
 }  // namespace
 
 }  // namespace tests

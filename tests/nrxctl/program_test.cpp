@@ -46,12 +46,6 @@ TEST(nrxctl_program, prints_fixed_output_whole) {
     }
 }
 
-TEST(nrxctl_program, shows_a_sensor_at_level_1_by_default) {
-    const std::string detailed = golden_text("nrxctl_sensor_gyro_2.txt");
-    const std::string summary = detailed.substr(0, detailed.find("Clients ")) + "\n\n";
-    EXPECT_EQ(run("--sensor gyro").out, summary);
-}
-
 TEST(nrxctl_program, writes_generated_samples_in_blocks) {
     const auto writes = record_writes(program, split("--replay generate gyro sin 1 5"));
     ASSERT_EQ(writes.size(), 1U);

@@ -54,36 +54,6 @@ TEST_F(hid_devices, read_feature_reports_while_they_are_open) {
     read(0xe1, 8, bad_argument);
 }
 
-TEST_F(hid_devices, can_only_be_closed_once_they_are_gone) {
-    EXPECT_FALSE(create_hid_device(service_named("bare")));
-    EXPECT_FALSE(create_hid_device({}));
-    const service button = service_named("button");
-    open(device);
-    host.remove("button");
-    EXPECT_FALSE(create_hid_device(button));
-    read(0xe0, 8, not_found);
-    EXPECT_EQ(open(device), not_found);
-    EXPECT_EQ(close(device), success);
-    device.reset();
-    EXPECT_EQ(open(device), not_found);
-    read(0xe0, 8, not_found);
-    EXPECT_EQ(close(device), bad_argument);
-}
-
-TEST_F(hid_devices, left_open_are_counted_after_their_release) {
-    open(device);
-    open(device);
-    EXPECT_EQ(host.open_handles(), 2U);
-    close(device);
-    EXPECT_EQ(host.open_handles(), 1U);
-    machine inner;
-    const simulated::installed_machine installed(inner);
-    EXPECT_FALSE(service_named("button")) << "the machine installed last is used";
-    inner.add({.name = "other", .hid = hid});
-    open(create_hid_device(service_named("other")));
-    EXPECT_EQ(inner.open_handles(), 1U);
-}
-
 class hid_plugins : public device_test {
 protected:
     scripted_records& records = add_hid_device(host, "accel-hid", 16);
@@ -124,18 +94,6 @@ TEST_F(hid_plugins, deliver_records_to_the_callback_set_last) {
     EXPECT_EQ(records.modes, (decltype(records.modes){{16, 1}, {16, 0}}));
 }
 
-TEST_F(hid_plugins, fail_with_the_code_of_the_device_or_without_it) {
-    records.mode_result = bad_argument;
-    EXPECT_EQ(set_mode(device, 17, 1), bad_argument);
-    host.remove("accel-hid");
-    for (int round = 0; round < 2; ++round) {
-        EXPECT_EQ(schedule_on_loop(device), not_found);
-        EXPECT_EQ(set_record_callback(device, {}), not_found);
-        EXPECT_EQ(set_mode(device, 16, 1), not_found);
-        device.reset();
-    }
-}
-
 class hid_event_clients : public device_test {
 protected:
     hid_event_clients() {
@@ -172,32 +130,12 @@ TEST_F(hid_event_clients, receive_notifications_once_they_have_callbacks) {
     EXPECT_EQ(delivered, "event 13, reset, update 3, update 3, ");
 }
 
-TEST_F(hid_event_clients, list_present_hid_services) {
-    add_hid_device(host, "a", 1);
-    add_hid_device(host, "b", 2);
-    host.add({.name = "no-hid"});
-    host.remove("a");
-    EXPECT_TRUE(list_hid_services(create_hid_event_client()));
-    EXPECT_EQ(logged_calls("release")[0], "release list of 1 hid services");
-}
-
 TEST_F(hid_event_clients, need_an_event_system_and_a_handle) {
     set_callbacks({}, not_found);
     EXPECT_EQ(schedule_on_loop(hid_event_client()), not_found);
     EXPECT_FALSE(list_hid_services({}));
     host.set_hid_events({});
     EXPECT_FALSE(create_hid_event_client());
-}
-
-TEST(hid_events, scale_latency_and_read_absent_fields_as_0) {
-    const hid_event event{.latency_nanoseconds = 1'234'567,
-                          .integers = {{accelerometer_type, -4}},
-                          .reals = {{accelerometer_x, 0.5}, {accelerometer_y, -2}}};
-    EXPECT_EQ(event.latency(1'000), 1'234);
-    EXPECT_EQ(event.integer(accelerometer_type), -4);
-    EXPECT_EQ(event.integer(accelerometer_x), 0);
-    EXPECT_EQ(event.real(accelerometer_y), -2);
-    EXPECT_EQ(event.real(accelerometer_type), 0);
 }
 
 }  // namespace tests

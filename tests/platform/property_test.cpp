@@ -1,7 +1,5 @@
 #include "platform/property.h"
 
-#include <limits>
-
 #include <gtest/gtest.h>
 
 #include "tests/support/rows.h"
@@ -12,18 +10,6 @@ using platform::array;
 using platform::describe;
 using platform::dictionary;
 using platform::property;
-
-constexpr std::int64_t max_number = std::numeric_limits<std::int64_t>::max();
-
-TEST(property, has_exactly_one_kind) {
-    const std::vector<property> kinds{-3, max_number, "name", array{1}, dictionary{{"k", 1}}};
-    for (std::size_t kind = 0; kind < kinds.size(); ++kind) {
-        EXPECT_EQ(kinds[kind].number().has_value(), kind < 2) << kind;
-        EXPECT_EQ(kinds[kind].text() != nullptr, kind == 2) << kind;
-        EXPECT_EQ(kinds[kind].items() != nullptr, kind == 3) << kind;
-        EXPECT_EQ(kinds[kind].entries() != nullptr, kind == 4) << kind;
-    }
-}
 
 TEST(property, dictionary_keeps_keys_in_the_order_first_set) {
     dictionary all{{"b", 1}, {"a", 2}, {"b", 3}};
@@ -46,14 +32,6 @@ TEST(property, compares_by_content) {
           row{a1, dictionary{{"a", 1}, {"b", 2}}, false}, row{a1, dictionary{{"a", 2}}, false},
           row{a1, dictionary{{"b", 1}}, false}})
         EXPECT_TRUE(same_value(a, b) == equal && same_value(b, a) == equal) << describe(a);
-}
-
-TEST(property, is_described_on_one_line) {
-    EXPECT_EQ(describe(max_number), "9223372036854775807");
-    EXPECT_EQ(describe("a\nb\x7f\xc3\xa4"), "\"a.b.\xc3\xa4\"");
-    EXPECT_EQ(describe(dictionary{}), "{}");
-    EXPECT_EQ(describe(array{-1, array{2, 3}, dictionary{{"k", "v"}, {"n", array{}}}}),
-              R"((-1, (2, 3), {k = "v"; n = ()}))");
 }
 
 }  // namespace tests

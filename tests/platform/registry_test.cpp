@@ -105,17 +105,6 @@ TEST_F(registry_entries, are_all_found_unless_the_look_up_fails) {
     EXPECT_TRUE(services.empty());
 }
 
-TEST_F(registry_entries, have_children_in_the_service_plane) {
-    host.add({.name = "second"}, host.find("gyro"));
-    const service parent = service_named("gyro");
-    EXPECT_EQ(name_of(first_child(parent, "IOService")), "gyro-hid");
-    EXPECT_FALSE(first_child(parent, "IOPower"));
-    EXPECT_FALSE(first_child(service_named("second"), "IOService"));
-    EXPECT_FALSE(first_child(service(), "IOService"));
-    host.remove("gyro-hid");
-    EXPECT_EQ(name_of(first_child(parent, "IOService")), "second");
-}
-
 TEST_F(registry_entries, copy_properties_and_need_a_driver_to_set_them) {
     const service gyro = service_named("gyro");
     const auto before = read_property(gyro, "rate");

@@ -114,9 +114,6 @@ TEST_F(host_clocks, read_the_same_instant_and_sleep_the_whole_duration) {
     EXPECT_EQ(reading.wall.seconds, 1'700'000'001);
     EXPECT_EQ(reading.wall.microseconds, 750'000);
     host.clock().follow_host();
-    const auto wall_before = std::chrono::system_clock::now().time_since_epoch();
-    EXPECT_NEAR(static_cast<double>(read_clocks().wall.seconds),
-                std::chrono::duration<double>(wall_before).count(), 10);
     const auto steady_before = std::chrono::steady_clock::now();
     const auto ticks_before = ticks();
     sleep(20ms);

@@ -254,19 +254,4 @@ TEST(sample_files, negative_times_come_last_and_equal_times_keep_their_order) {
     EXPECT_EQ(read(text), expected + "accel 28 1 100 0 0 0 0 @9\n");
 }
 
-TEST(sample_files, lines_are_read_whole_wherever_the_buffer_ends) {
-    // The file is larger than the buffer, and so is one line.
-    const std::string filler(300'000, 'k');
-    std::string text;
-    std::string expected;
-    for (int i = 0; i < 9000; ++i) {
-        const std::string number = std::to_string(i);
-        text += at("accel", number, number);
-        expected +=
-            "accel 28 " + std::to_string(i > 0) + " " + number + " 0 0 0 0 @" + number + "\n";
-        if (i == 4000) text += "#" + filler + "\n";
-    }
-    EXPECT_EQ(read(text), expected);
-}
-
 }  // namespace tests

@@ -88,44 +88,4 @@ TEST_F(virtual_replay, refuses_malformed_requests) {
     EXPECT_EQ(app.states(), u32_report({7, 0, 0, 9, 0, 0}));
 }
 
-TEST_F(virtual_replay, sets_all_states_of_a_report_or_none) {
-    const byte_list samples = u32_report({9, 3, 2, 1, 40, 20, 0, 0, 0, 0, 20, 5, 5, 5, 5});
-    EXPECT_EQ(app.load(samples), success);
-    EXPECT_EQ(app.load(samples), not_ready);
-    for (const auto& [entries, code] :
-         rows<byte_list, return_code>{{u32_report({9, 5, 2, 8, 0, 2}), not_found},
-                                      {u32_report({9, 5, 2, 9, 0, 0}), bad_argument},
-                                      {u32_report({9, 5, 2, 9, 0, 3}), bad_argument},
-                                      {u32_report({9, 5, 2, 7, 0, 2}), not_ready},
-                                      {u32_report({9, 5, 2, 7, 0}), bad_argument}}) {
-        EXPECT_EQ(app.set_states(entries), code);
-        EXPECT_EQ(app.states(), u32_report({7, 0, 0, 9, 0, 1}));
-    }
-    EXPECT_EQ(app.set_states(u32_report({9, 5, 2})), success);
-    EXPECT_EQ(app.states(), u32_report({7, 0, 0, 9, 5, 2}));
-    EXPECT_EQ(app.unload(u32_report({9})), success);
-    EXPECT_EQ(app.states(), u32_report({7, 0, 0, 9, 0, 0}));
-}
-
-using hid_driver = device_test;
-
-TEST_F(hid_driver, counts_present_devices_and_their_usages) {
-    add_interface_services(host);
-    add_hid_devices(host);
-    host.remove("accel-hid");
-    connection conn;
-    EXPECT_EQ(open(service_named("KeltoNRXHIDDriver"), 0, conn), unsupported);
-    EXPECT_EQ(open(service_named("KeltoNRXHIDDriver"), 0x7a756d6f, conn), success);
-    using row = std::tuple<std::uint8_t, std::uint8_t, return_code, std::uint32_t>;
-    for (const auto& [request, location, code, value] :
-         {row{0, 0, success, 0x3010c}, row{1, 9, success, 6}, row{2, 0x40, success, 2},
-          row{2, 0x10, not_found, 0}, row{3, 0, unsupported, 0}}) {
-        const byte_list bytes{request, 0, 0, 0, location, 0, 0, 0};
-        byte_list answer = reply(conn, {code, 0, {}, bytes, 16});
-        answer.resize(16);
-        EXPECT_EQ(load_u32(answer, 8), value);
-    }
-    reply(conn, {bad_argument, 0, {}, {1, 0, 0, 0}, 16});
-}
-
 }  // namespace tests

@@ -1,4 +1,4 @@
-// The virtual profiler: its configuration, its stream, its logs and its statistics.
+// The stream of the virtual profiler.
 
 #include "platform/virtual/profiler/profiler.h"
 
@@ -53,22 +53,6 @@ protected:
     simulated::event_stream& stream = *profiler.stream();
 };
 
-TEST_F(virtual_profiler, each_half_enables_what_it_supports) {
-    const byte_list all = configs({enabled(6, 1), enabled(7, 0), enabled(2, 7), enabled(10, 0)});
-    EXPECT_EQ(profiler.configure_kernel(configs({enabled(2, 0), enabled(2, 1)})), success);
-    EXPECT_EQ(profiler.kernel_configs(103), configs({enabled(2, 0)})) << "only complete records";
-    profiler.configure_kernel(configs({{.profiler = 2, .state = component_config::stop}}));
-    EXPECT_EQ(profiler.configure_kernel(all), unsupported);
-    EXPECT_EQ(profiler.kernel_configs(1040), configs({enabled(10, 0)}));
-    EXPECT_EQ(profiler.configure_coprocessor(all), unsupported);
-    EXPECT_EQ(profiler.coprocessor_configs(1040), configs({enabled(6, 1), enabled(10, 0)}));
-    profiler.configure_coprocessor(
-        configs({enabled(6, 1, 1), {.profiler = 10, .state = component_config::disable}}));
-    EXPECT_EQ(profiler.coprocessor_configs(1040), configs({enabled(6, 1, 1)}));
-    profiler.stop_coprocessor();
-    EXPECT_EQ(profiler.coprocessor_configs(1040), byte_list());
-}
-
 TEST_F(virtual_profiler, stream_delivers_batches_until_the_queue_is_full) {
     profiler.configure_coprocessor(configs({enabled(2, 5, 0x10000), enabled(4, 0, 2)}));
     profiler.set_enabled(true);
@@ -114,40 +98,6 @@ TEST_F(virtual_profiler, stream_ends_once_on_request_or_after_a_duration) {
     EXPECT_EQ(clock.now(), 55ms);
     ASSERT_EQ(events.size(), 11U);
     EXPECT_EQ(events.back().type, 0U);
-}
-
-TEST_F(virtual_profiler, logs_and_error_dump_are_emptied_by_reading) {
-    for (const std::size_t size : {48U, 0U}) {
-        EXPECT_EQ(profiler.read_kernel_log(95).size(), size);
-        EXPECT_EQ(profiler.read_coprocessor_log(65536).size(), size);
-        EXPECT_TRUE(profiler.read_error_dump(48000).empty());
-    }
-    profiler.configure_coprocessor(configs({enabled(0, 0)}));
-    profiler.set_enabled(true);
-    clock.advance(40ms);
-    profiler.dump_errors();
-    const byte_list dump = profiler.read_error_dump(48000);
-    ASSERT_EQ(dump.size(), 33U * 48U);
-    EXPECT_EQ(event(byte_view(dump).last(96)).time, 40000U);
-    EXPECT_EQ(event(byte_view(dump).last(48)).category, 8U);
-}
-
-TEST_F(virtual_profiler, statistics_grow_and_requests_are_checked) {
-    const auto shared = add_profiler_driver(host);
-    interface_driver& coprocessor = add_service(host, "profile", 1);
-    serve_profile(coprocessor, shared);
-    clock.advance(60s);
-    EXPECT_EQ(load_u32(shared->statistics().event_sources(), 48), 1200U);
-    EXPECT_EQ(load_u32(shared->statistics().wake_requests(), 4), 15U);
-    for (const method_call& row : {method_call{success, 3, {0x20}, byte_list(8)},
-                                   {bad_argument, 3, {0x20}, byte_list(4)},
-                                   {unsupported, 3, {0x20}, {1, 0, 0, 0, 0, 0, 0, 0}},
-                                   {bad_argument, 1, {0xd2}, {1, 0, 0}},
-                                   {bad_argument, 1, {0xd5}, {2, 0, 0, 0}}})
-        reply(coprocessor, row);
-    reply(*host.find("KeltoNRXProfileDriver")->driver, {bad_argument, 0, {2}});
-    EXPECT_EQ(load_u32(shared->statistics().event_sources(), 48), 0U) << "cleared";
-    EXPECT_EQ(load_u32(shared->statistics().wake_requests(), 4), 15U);
 }
 
 }  // namespace
