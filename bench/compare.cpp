@@ -11,7 +11,7 @@
 #include <string_view>
 #include <vector>
 
-#include "bench/process_times.h"
+#include "bench/process_cost.h"
 
 namespace {
 
@@ -59,11 +59,11 @@ double median(const std::vector<double>& values) {
 measurements run(const comparison& comparison) {
     measurements results;
     // Warms the page cache with everything that the two read.
-    bench::run_once(comparison.ours);
-    bench::run_once(comparison.peer);
+    bench::measure_process(comparison.ours);
+    bench::measure_process(comparison.peer);
     for (int i = 0; i < comparison.pairs; ++i) {
-        const auto ours = bench::run_once(comparison.ours);
-        const auto peer = bench::run_once(comparison.peer);
+        const auto ours = bench::measure_process(comparison.ours);
+        const auto peer = bench::measure_process(comparison.peer);
         results.ours.push_back(ours.microseconds);
         results.peer.push_back(peer.microseconds);
         results.ratios.push_back(ours.microseconds / peer.microseconds);

@@ -13,11 +13,11 @@
 
 namespace {
 
-std::optional<std::int64_t> parse(std::string_view word) {
+std::optional<std::int64_t> parse(std::string_view text) {
     std::optional<std::int64_t> value;
     std::optional<std::int64_t> fast_value;
-    fuzz::completes([&] { value = nrx::parse_number(word, "not a number"); });
-    fuzz::completes([&] { fast_value = nrx::parse_fast_number(word, "not a number"); });
+    fuzz::completes([&] { value = nrx::parse_number(text, "not a number"); });
+    fuzz::completes([&] { fast_value = nrx::parse_fast_number(text, "not a number"); });
     fuzz::require(value == fast_value);
     return value;
 }
@@ -27,30 +27,30 @@ std::string format(std::int64_t value, int base) {
     const bool negative = value < 0;
     const auto end = std::to_chars(digits.data(), digits.data() + digits.size(),
                                    negative ? -value : value, base);
-    std::string word = negative ? "-" : "";
-    if (base == 16) word += "0x";
-    return word.append(digits.data(), end.ptr);
+    std::string text = negative ? "-" : "";
+    if (base == 16) text += "0x";
+    return text.append(digits.data(), end.ptr);
 }
 
-bool is_sign_and_digits(std::string_view word) {
-    const auto sign = word.find_first_not_of("+-");
+bool is_sign_and_digits(std::string_view text) {
+    const auto sign = text.find_first_not_of("+-");
     if (sign > 1) return false;
-    word.remove_prefix(sign);
-    const bool hexadecimal = word.starts_with("0x");
-    if (hexadecimal) word.remove_prefix(2);
+    text.remove_prefix(sign);
+    const bool hexadecimal = text.starts_with("0x");
+    if (hexadecimal) text.remove_prefix(2);
     const auto* digits = hexadecimal ? "0123456789abcdefABCDEF" : "0123456789";
-    return !word.empty() && word.find_first_not_of(digits) == std::string_view::npos;
+    return !text.empty() && text.find_first_not_of(digits) == std::string_view::npos;
 }
 
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    const auto word = fuzz::as_text(data, size);
-    const auto value = parse(word);
+    const auto text = fuzz::as_text(data, size);
+    const auto value = parse(text);
     if (!value) return 0;
-    fuzz::require(is_sign_and_digits(word));
+    fuzz::require(is_sign_and_digits(text));
     fuzz::require(parse(format(*value, 10)) == value);
     fuzz::require(parse(format(*value, 16)) == value);
-    fuzz::require(!parse(std::string(word) + "g"));
+    fuzz::require(!parse(std::string(text) + "g"));
     return 0;
 }

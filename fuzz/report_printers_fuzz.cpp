@@ -15,15 +15,15 @@
 
 namespace {
 
-void print_record(std::string_view /*service_name*/, nrx::report_id /*id*/,
-                  platform::byte_view report) {
+void print_spi_status_report(std::string_view /*service_name*/, nrx::report_id /*id*/,
+                             platform::byte_view report) {
     nrx::print_spi_status(report);
 }
 
 constexpr std::array<nrx::report_printer, 9> printers{
-    nrx::print_report, nrx::print_button_stats, nrx::print_haptic_assets,
-    print_record,      nrx::print_hex,          nrx::print_text,
-    nrx::print_raw,    nrx::print_u32,          nrx::print_text_or_dump,
+    nrx::print_report,       nrx::print_button_stats, nrx::print_haptic_assets,
+    print_spi_status_report, nrx::print_hex,          nrx::print_text,
+    nrx::print_raw,          nrx::print_u32,          nrx::print_text_or_dump,
 };
 
 }  // namespace

@@ -11,7 +11,7 @@ namespace nrx::keyprobe {
 
 namespace {
 
-constexpr char collect_all_option = 's';
+constexpr char collect_all_option = 's';  // not a short option
 
 constexpr std::array long_options{
     option{"collectall", no_argument, nullptr, collect_all_option},
@@ -30,10 +30,12 @@ constexpr std::array long_options{
 
 int run(int argc, char** argv) {
     if (argc == 0) print_usage("keyprobe");
-    ::unsetenv("POSIXLY_CORRECT");  // would end the parsing at the first argument that is no option
-    optind = 0;                     // resets the parser, which an earlier run may have used
+    ::unsetenv(
+        "POSIXLY_CORRECT");  // would end the parsing at the first argument that is not an option
+    optind = 0;              // resets the parser, which an earlier run may have used
     while (true) {
-        // The parser knows these letters, so it prints no message of its own before the usage line.
+        // -b and -f ARGUMENT are known so that the parser prints no message of its own for them
+        // before the usage line.
         const int option = getopt_long(argc, argv, "bf:", long_options.data(), nullptr);
         if (option == -1) return EXIT_SUCCESS;
         if (option != collect_all_option) print_usage(argv[0]);

@@ -32,7 +32,7 @@ return_code read_feature_report(const hid_device& device, std::uint8_t report_id
                                 byte_span& report);
 
 // Closes the device without options. Fails with bad_argument if it was not open, and with the
-// device's code; in the latter case the device is closed nevertheless.
+// device's code; the device is closed even then.
 return_code close(const hid_device& device);
 
 }  // namespace platform

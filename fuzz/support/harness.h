@@ -18,7 +18,7 @@ inline void require(bool condition) {
 
 // Runs an action. Returns false if it tried to end the process.
 template <class Action>
-bool completes(const Action& action) {
+bool run_to_completion(const Action& action) {
     try {
         action();
         return true;

@@ -1,5 +1,6 @@
-// The clock values that times are measured with, process-wide. A front end sets them from the
-// platform before it starts a monitor or prints HID events; they are 0 before.
+// The tick period and the reference instants with which times are computed, process-wide. A front
+// end sets them from the platform before it starts a monitor or prints HID events; they are 0
+// before.
 #pragma once
 
 namespace nrx {

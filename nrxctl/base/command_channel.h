@@ -3,7 +3,7 @@
 //
 // Each operation finds its service, opens a connection, makes one call, closes and releases. It
 // returns not_found if the service is missing, no_memory if the platform returns no connection, or
-// the platform's code of the open or the call. Each failed check writes one failure report.
+// the platform's code for the failed open or call. Each failed check writes one failure report.
 #pragma once
 
 #include <cstdint>

@@ -1,4 +1,4 @@
-// The only place where the library ends the process.
+// The only place where the library exits.
 #pragma once
 
 namespace nrx {

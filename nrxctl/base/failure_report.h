@@ -22,12 +22,12 @@ struct source_location {
 // Writes one failure report, a line, on standard error:
 //   Assertion failed: <label>: Check failed: <condition> <exit label> <message> <file>:<line> <text
 //   of the code> (0x<code>)
-// Null texts, a line of 0 and a code of 0 leave their part out.
+// A null text, a line of 0 and a code of 0 are omitted.
 void report_failure(const char* label, const char* condition, const char* exit_label,
                     const char* message, const char* file, int line, platform::return_code code);
 
 // Reports a failed check of the subsystem with the given label unless the condition holds. Returns
-// holds. The text of the condition is what a reader of the report expects, not C++.
+// the condition's value. The text of the condition is what a reader of the report expects, not C++.
 bool check_as(const char* label, bool holds, const char* condition, platform::return_code code,
               source_location location);
 
@@ -40,6 +40,11 @@ inline constexpr const char* kr_is_zero_without_space = "kr == 0";
 inline constexpr const char* result_is_zero = "result == 0 ";
 inline constexpr const char* success = "success";
 inline constexpr const char* service = "service";
+inline constexpr const char* child = "child";
+inline constexpr const char* property_name = "propertyName";
+inline constexpr const char* property = "property";
+inline constexpr const char* result = "result";
+inline constexpr const char* never = "false";
 inline constexpr const char* arguments_remain = "argc > optind";
 
 }  // namespace condition

@@ -5,7 +5,7 @@
 
 namespace nrx {
 
-// Identifies a report of an interface service, 0x00 to 0xff.
+// Identifies a report of an interface service. Drivers use 0x00 to 0xff.
 using report_id = std::uint32_t;
 
 // Identifies an interface service: the value of its property "service_id".

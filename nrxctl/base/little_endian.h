@@ -1,4 +1,4 @@
-// Little-endian numbers in byte buffers, wherever they stand.
+// Little-endian numbers in byte buffers, at any alignment.
 #pragma once
 
 #include <concepts>
@@ -11,8 +11,8 @@
 
 namespace nrx {
 
-// The number in the first sizeof(Number) bytes at source. One expression, as compilers make a
-// single load of that, and not of a loop.
+// The number in the first sizeof(Number) bytes at source. A single expression, which compilers turn
+// into one load; a loop they do not.
 template <std::integral Number>
 constexpr Number load_le(const std::uint8_t* source) {
     using bits = std::make_unsigned_t<Number>;
@@ -38,7 +38,7 @@ inline void append_le(std::vector<std::uint8_t>& bytes, std::uint64_t value, std
     }
 }
 
-// Appends numbers of 32 bits likewise.
+// Appends 32-bit numbers, least significant byte first.
 inline void append_words(std::vector<std::uint8_t>& bytes,
                          std::initializer_list<std::uint32_t> words) {
     for (const std::uint32_t word : words)

@@ -31,8 +31,8 @@ public:
                                Text fallback = {})
         : rows_(rows), fallback_(fallback) {}
 
-    // Returns the name of a number, or null if it has none. If two rows have the number, the first
-    // one counts, except that a row at the position of its number is found at once.
+    // Returns the name of a number, or null if it has none. The row at index number is tried first,
+    // then the rows in order.
     [[nodiscard]] constexpr const Text* find(std::uint32_t number) const {
         if (number < rows_.size() && rows_[number].number == number) return &rows_[number].name;
         const auto match = std::find_if(rows_.begin(), rows_.end(),

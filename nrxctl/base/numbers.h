@@ -13,7 +13,7 @@ inline constexpr std::string_view hex_prefix = "0x";
 // The prefix of a decimal value in a payload, where hexadecimal is the default.
 inline constexpr std::string_view decimal_prefix = "0d";
 
-// Returns true if every character is a decimal digit, also for an empty text.
+// Returns true if every character is a decimal digit, or if the text is empty.
 bool all_digits(std::string_view text);
 
 // Returns the value of a run of digits in base 10 or 16, without sign, prefix or spaces. Returns
@@ -41,12 +41,12 @@ constexpr number_parts split_number(std::string_view argument) {
 // process with status 1 after "message (argument)" as a line on standard output.
 std::int64_t parse_number(std::string_view argument, std::string_view message);
 
-// Returns the low 32 bits of such a number.
+// Returns the low 32 bits of the value of parse_number.
 inline std::uint32_t parse_low_32_bits(std::string_view argument, std::string_view message) {
     return static_cast<std::uint32_t>(parse_number(argument, message));
 }
 
-// Returns the number itself. Rejects a negative one, and one greater than max, likewise.
+// Returns a number from 0 to max. Rejects any other argument as parse_number does.
 std::uint32_t parse_number_up_to(std::uint32_t max, std::string_view argument,
                                  std::string_view message);
 

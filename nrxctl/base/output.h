@@ -24,10 +24,10 @@ public:
     line_sink(const line_sink&) = delete;
     line_sink& operator=(const line_sink&) = delete;
 
-    // Writes text, which consists of whole lines. Returns false if it could not be written.
+    // Writes text, usually whole lines, in one piece. Returns false if it could not be written.
     virtual bool write(std::string_view text) = 0;
 
-    // Writes what the sink holds back. Returns false if it could not be written.
+    // Writes what the sink has buffered. Returns false if it could not be written.
     virtual bool flush() { return true; }
 
     // Returns true if any text was lost so far.
@@ -55,7 +55,8 @@ private:
 };
 
 // Makes text from a device safe for a terminal: writes control characters (but tab and line feed)
-// and bytes that are not UTF-8 as "\x1b". Everything else passes unchanged to the target.
+// and bytes that are not UTF-8 as "\xNN", one for each byte; an escape becomes "\x1b". Everything
+// else passes unchanged to the target.
 class terminal_sink final : public line_sink {
 public:
     explicit terminal_sink(line_sink& target) : target_(target) {}
@@ -128,7 +129,8 @@ private:
 };
 
 // Prepares the streams of a program: text to a terminal passes a terminal_sink, and writing to a
-// pipe that nobody reads fails instead of ending the process. A program creates one first thing.
+// pipe that nobody reads fails instead of ending the process. A program creates one before it
+// writes anything.
 class program_output {
 public:
     program_output();
@@ -147,18 +149,18 @@ private:
     std::optional<terminal_filter> error_;
 };
 
-// Writes text, which brings its own line feeds, on standard output. Returns false if it could not
-// be written.
+// Writes text, to which no line feed is added, on standard output. Returns false if it could not be
+// written.
 bool write_output(std::string_view text);
 
 // Writes text and a line feed on standard output.
 void print_line(std::string_view text);
 
-// Writes text, which brings its own line feeds, on standard error, after all standard output so
-// far.
+// Writes text, to which no line feed is added, on standard error, after all buffered standard
+// output.
 void write_error(std::string_view text);
 
-// Writes standard output that is held back. Call it before waiting for anything.
+// Writes buffered standard output. Call it before waiting for anything.
 void flush_output();
 
 }  // namespace nrx

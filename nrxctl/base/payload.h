@@ -12,7 +12,7 @@ namespace nrx {
 // Values are hexadecimal, with or without "0x", or decimal after "0d".
 //
 // Reads arguments from position on, up to the end or to one that begins with "-", and leaves
-// position there. A value that is no signed 32-bit number, or too large for the width, ends the
+// position there. A value that is not a signed 32-bit number, or too large for the width, ends the
 // process with status 1 after a message on standard output.
 void parse_payload(std::span<char* const> arguments, int& position,
                    std::vector<std::uint8_t>& payload);

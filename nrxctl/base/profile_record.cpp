@@ -30,7 +30,7 @@ void read_profile_records(record_printer print) {
     for (int read = 0; read < max_reads; ++read) {
         platform::byte_span records = buffer;
         const auto result = get_report("profile", profile_log_report, records);
-        if (!check_success(result, "result == 0 ")) return;
+        if (!check_success(result, condition::result_is_zero)) return;
         if (records.empty()) return;
         print_complete_records(records, print);
     }

@@ -53,7 +53,7 @@ struct profile_record {
     [[nodiscard]] std::uint64_t u64(record_offset<std::uint64_t> offset) const {
         return load(offset);
     }
-    [[nodiscard]] platform::byte_view run(record_extent extent) const {
+    [[nodiscard]] platform::byte_view bytes_at(record_extent extent) const {
         return platform::byte_view(bytes).subspan(extent.offset, extent.size);
     }
 

@@ -9,9 +9,9 @@ namespace nrx {
 bool service_conn::open(on_failure on_missing) {
     service_ = platform::first_match(match_name(name_));
     if (!service_ && on_missing == on_failure::ignore) return false;
-    if (!check(service_, "service")) return false;
+    if (!check(service_, condition::service)) return false;
     child_ = platform::first_child(service_, platform::service_plane);
-    if (!check(child_, "child")) return false;
+    if (!check(child_, condition::child)) return false;
     return open_connection(child_, 0, connection_) == platform::success;
 }
 

@@ -14,7 +14,7 @@ namespace nrx {
 
 namespace {
 
-// The condition of a look-up, as its failure report has always named it.
+// The condition of a look-up, in failure reports.
 constexpr const char* service_is_not_null = "service != ((io_object_t) 0)";
 
 bool is_numeric(std::string_view service_name) {
@@ -162,17 +162,17 @@ platform::return_code list_services() {
 
 platform::return_code set_service_property(const platform::service& service, const char* name,
                                            const platform::property* value) {
-    if (!check(name, "propertyName")) return platform::bad_argument;
-    if (!check(value, "property")) return platform::bad_argument;
+    if (!check(name, condition::property_name)) return platform::bad_argument;
+    if (!check(value, condition::property)) return platform::bad_argument;
     const platform::return_code kr = platform::set_property(service, name, *value);
     check_success(kr, condition::kr_is_zero);
     return kr;
 }
 
 platform::return_code show_service_property(const platform::service& service, const char* name) {
-    if (!check(name, "propertyName")) return platform::success;
+    if (!check(name, condition::property_name)) return platform::success;
     const auto property = platform::read_property(service, name);
-    if (!check(property, "property")) return platform::success;
+    if (!check(property, condition::property)) return platform::success;
     write_error(platform::describe(*property) + "\n");
     return platform::success;
 }

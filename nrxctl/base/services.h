@@ -60,7 +60,7 @@ platform::service find_hid_device(std::string_view name);
 
 // Stores the service id that a service name stands for in id. A number is its own id, whether or
 // not such a service exists. Returns false and leaves id unchanged if the named service does not
-// exist (with a failure report), has no id, or the number is no valid id.
+// exist (with a failure report), has no id, or the number is not a valid id.
 bool resolve_service_id(std::string_view name, service_id& id);
 
 // Stores the registry name of the interface service with that id in name. Returns false with a

@@ -122,7 +122,7 @@ constinit const uart_decoder uart;
 constinit const profile_decoder control;
 constinit const scm_decoder scm;
 constinit const wake_decoder wake;
-constinit const profile_decoder other;
+constinit const profile_decoder default_category;
 
 struct category_row {
     std::uint32_t category;
@@ -145,7 +145,7 @@ const profile_decoder* decoder_for_category(std::uint32_t category) {
 }
 
 const profile_decoder& default_decoder() {
-    return other;
+    return default_category;
 }
 
 }  // namespace nrx

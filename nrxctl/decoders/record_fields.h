@@ -27,10 +27,10 @@ struct field_key {
 };
 
 enum class row_kind : std::uint8_t {
-    u8,            // unsigned numbers in decimal
-    u16,           //
-    u32,           //
-    u64,           //
+    u8,            // unsigned, in decimal
+    u16,           // the same
+    u32,           // the same
+    u64,           // the same
     hex_u32,       // unsigned, in hexadecimal and single quotes
     q16_16,        // signed 32 bits, of which 16 are the fraction
     q20_12,        // signed 32 bits, of which 12 are the fraction

@@ -103,21 +103,21 @@ inline constexpr std::array decimation_info_rows{
 // By type. A type beyond the table has no body.
 inline constexpr std::array body_by_type{
     record_rows(),                        // stop
-    record_rows(long_data_rows),          //
-    record_rows(short_data_rows),         //
-    record_rows(event_rows),              //
-    record_rows(trigger_rows),            //
-    record_rows(function_rows),           //
+    record_rows(long_data_rows),          // long-data
+    record_rows(short_data_rows),         // short-data
+    record_rows(event_rows),              // event
+    record_rows(trigger_rows),            // trigger
+    record_rows(function_rows),           // function
     record_rows(),                        // kpdx-context1
     record_rows(),                        // kpdx-context2
-    record_rows(sensor_info_rows),        //
-    record_rows(external_function_rows),  //
+    record_rows(sensor_info_rows),        // sensorinfo
+    record_rows(external_function_rows),  // extfunction
     record_rows(),                        // kpdx-context
-    record_rows(annotation_rows),         //
-    record_rows(decimation_info_rows),    //
+    record_rows(annotation_rows),         // annotation
+    record_rows(decimation_info_rows),    // decimationinfo
 };
 
-// Bodies that two categories have for single records, which they recognize by the first word.
+// Bodies of records that a category decoder selects by the first word (category_decoders.cpp).
 
 inline constexpr std::array talvor_data_in_rows{
     rows::u32("arg1", 16), rows::u32("arg2", 20), rows::u32("arg3", 24),

@@ -53,7 +53,7 @@ public:
             text_ = short_text().append(
                 {text.data(), std::strftime(text.data(), text.size(), "%b %d %T", &local)});
             second_ = second;
-            // After the conversion, which may set them.
+            // Read after localtime_r, which may change them.
             standard_offset_ = ::timezone;
             has_daylight_ = ::daylight;
         }

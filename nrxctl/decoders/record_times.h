@@ -12,9 +12,9 @@ namespace nrx {
 // coprocessor's time. Months are named as in the C locale. Returns nullopt silently if there is no
 // time-sync service or its sync point lacks a number.
 //
-// The sync point is read from the registry at every call. The text of the last second is kept.
-// After tzset it is made anew if the new time zone differs in its standard offset or in whether it
-// has daylight saving time; other differences show from the next second on.
+// The sync point is read from the registry at every call. The text of the last second is cached. It
+// is formatted again if tzset has changed the zone's standard offset or whether it has daylight
+// saving time; any other change of the zone takes effect from the next second on.
 std::optional<short_text> calendar_time(std::uint64_t timestamp);
 
 // Returns the host's boot time in microseconds since 1970, UTC. Returns nullopt silently if the

@@ -43,7 +43,7 @@ void scm_packet_printer::print_data(const profile_record& record) const {
     text_line label;
     label.text(label_).text(":   data[").number(offset).text("-").number(length - 1);
     label.text("/").number(packet_size).text("]: ");
-    const auto data = record.run(data_extent);
+    const auto data = record.bytes_at(data_extent);
     nrx_profile_hexdump(label.view(), data.first(std::min<std::size_t>(length, data.size())), 1);
 }
 

@@ -92,7 +92,8 @@ constexpr std::array stats_key_rows{
     name_row{55, "wqr.audio.btmspk.prewarm.duration"},
     name_row{57, "wqr.test"},
 };
-constexpr name_table stats_key_names(stats_key_rows, "?");
+constexpr std::string_view unknown_key = "?";
+constexpr name_table stats_key_names(stats_key_rows, unknown_key);
 
 void print_record(platform::byte_view bytes) {
     const reply_fields record(bytes);
@@ -102,8 +103,9 @@ void print_record(platform::byte_view bytes) {
         operation_rows[std::min<std::size_t>(record.u8(1), operation_rows.size() - 1)];
     std::ostream& out = event_stream();
     out << "TALY_CALLBACK" << row.label;
-    if (stats_key_names.find(key) != nullptr) out << key_domain;
-    out << stats_key_names.name(key);
+    const std::string_view name = stats_key_names.name(key);
+    if (name != unknown_key) out << key_domain;
+    out << name;
     if (row.value == value_kind::integer) out << " " << value;
     if (row.value == value_kind::q16_16) out << " " << value / q16_16_one;
     end_event_line();

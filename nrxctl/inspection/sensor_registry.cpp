@@ -24,7 +24,7 @@ constexpr std::string_view list_failure = "Can't enumerate HID services";
 // Replaces an entry by its first child.
 bool descend(platform::service& entry) {
     platform::service child = platform::first_child(entry, platform::service_plane);
-    if (!check(child, "child")) return false;
+    if (!check(child, condition::child)) return false;
     entry = std::move(child);
     return true;
 }

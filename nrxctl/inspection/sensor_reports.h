@@ -84,10 +84,10 @@ enum class sensor_property {
     internal_calibration,  // s32, at 100 Hz
     calibration_source,    // u32: uncalibrated, default, sysconfig
     location,              // a character (0: none), then the alternate index, s32
+    count,
 };
 
-inline constexpr std::size_t sensor_property_count =
-    static_cast<std::size_t>(sensor_property::location) + 1;
+inline constexpr auto sensor_property_count = static_cast<std::size_t>(sensor_property::count);
 
 class sensor_properties {
 public:

@@ -10,7 +10,7 @@ namespace {
 
 constexpr double seconds_per_scan_period = 2.56;
 
-// Returns 0 unless the report holds both fields, so that no value is made from one of them alone.
+// Returns 0 unless the report holds both fields, because a difference needs both.
 template <class Number>
 Number difference(const reply_fields& fields, const field_row& row) {
     if (!fields.contains<Number>(row.offset) || !fields.contains<Number>(row.subtrahend)) return 0;

@@ -15,6 +15,11 @@ namespace {
 constexpr std::uint32_t every_report = 0xffffffff;
 constexpr std::uint32_t low_16_reports = 0xffff;
 
+// The keyword of a profiler is the name that the decoders give its category.
+consteval std::string_view profiler_keyword(std::uint32_t number) {
+    return id_name_table(category_names).find(number)->view();
+}
+
 // Components. Their keywords are the names that the decoders give them, except for "exec".
 
 // Returns the names of a decoder's components as keywords, followed by further ones.
@@ -74,7 +79,7 @@ constexpr std::array sensor_report_keywords{
     keyword_row{"error", 0x40000},
     keyword_row{"t-bad", 0x80000},
 };
-// "all" stands for the latency only; the latency of triggers has another bit than the sensors'.
+// "all" stands for the latency only; trigger latency uses a different bit here than for sensors.
 constexpr std::array orrin_report_keywords{
     keyword_row{"all", 0x1},
     keyword_row{"latency", 0x1},
@@ -115,42 +120,42 @@ constexpr report_grammar scm_reports{scm_report_keywords, false};
 constexpr report_grammar wake_reports{wake_report_keywords, false};
 
 constexpr std::array profilers{
-    profiler_grammar{.keyword = "exec",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::exec),
                      .number = profiler_number::exec,
                      .components = exec_keywords,
                      .takes_one_component_only = true,
                      .special_reports = exec_special_reports},
-    profiler_grammar{.keyword = "trace",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::trace),
                      .number = profiler_number::trace,
                      .components = trace_keywords,
                      .takes_numeric_components = true,
                      .reports = &trace_reports},
-    profiler_grammar{.keyword = "sensor",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::sensor),
                      .number = profiler_number::sensor,
                      .components = sensor_keywords,
                      .reports = &sensor_reports},
-    profiler_grammar{.keyword = "orrin",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::orrin),
                      .number = profiler_number::orrin,
                      .components = orrin_keywords,
                      .reports = &orrin_reports},
-    profiler_grammar{.keyword = "talvor",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::talvor),
                      .number = profiler_number::talvor,
                      .components = talvor_keywords,
                      .reports = &plain_reports},
-    profiler_grammar{.keyword = "interrupt",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::interrupt),
                      .number = profiler_number::interrupt,
                      .components = interrupt_keywords,
                      .reports = &plain_reports},
-    profiler_grammar{.keyword = "uart",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::uart),
                      .number = profiler_number::uart,
                      .components = uart_keywords,
                      .reports = &uart_reports},
-    profiler_grammar{.keyword = "scm",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::scm),
                      .number = profiler_number::scm,
                      .components = scm_keywords,
                      .takes_numeric_components = true,
                      .reports = &scm_reports},
-    profiler_grammar{.keyword = "wake",
+    profiler_grammar{.keyword = profiler_keyword(profiler_number::wake),
                      .number = profiler_number::wake,
                      .components = wake_keywords,
                      .all_components = "wake",

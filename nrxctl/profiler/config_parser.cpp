@@ -61,7 +61,7 @@ bool parse_component(const config_fields& fields, std::string_view component,
     const auto first_report =
         fields.reports.empty() ? std::nullopt : std::optional(fields.reports.front());
     const bool result = init_profiler_config(fields.profiler, component, first_report, config);
-    if (!check(result, "result")) return false;
+    if (!check(result, condition::result)) return false;
     const report_grammar* reports = find_report_grammar(fields.profiler, component);
     if (reports == nullptr) return true;
     config.reports = parse_reports(reports->keywords, fields.reports);
@@ -105,7 +105,7 @@ bool parse_profiler_config(std::string_view argument, std::vector<profiler_confi
     const field_list fields = split(argument, ':');
     if (fields.size() < 2 || fields.size() > 4) return false;
     const profiler_grammar* profiler = find_profiler_grammar(fields[0]);
-    if (!check(profiler, "false")) return false;
+    if (!check(profiler, condition::never)) return false;
     config_fields lists{*profiler, split(fields[1], ','), list_in_field(fields, 2),
                         list_in_field(fields, 3)};
     if (profiler->takes_one_component_only &&
@@ -124,7 +124,7 @@ bool parse_profiler_config(std::string_view argument, std::vector<profiler_confi
 bool parse_profiler_configs(argument_cursor& arguments, std::vector<profiler_config>& configs) {
     while (const auto argument = arguments.next()) {
         const bool result = parse_profiler_config(*argument, configs);
-        if (!check(result, "result")) return false;
+        if (!check(result, condition::result)) return false;
     }
     return true;
 }

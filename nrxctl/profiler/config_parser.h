@@ -1,5 +1,5 @@
 // Parses configuration arguments: <profiler>:<components>[:<reports>[:<services>]]. Components,
-// reports and services are lists with commas.
+// reports and services are comma-separated lists.
 #pragma once
 
 #include <optional>
@@ -21,8 +21,8 @@ bool parse_profiler_configs(argument_cursor& arguments, std::vector<profiler_con
 // unknown or if there are too many components or services. The configurations of the components
 // before the failure stay.
 //
-// A component or report that is no keyword, where numbers are allowed, must be a number of 32 bits.
-// Otherwise the process ends with status 1 after a message on standard output.
+// A component or report that is not a keyword, where numbers are allowed, must be a number of 32
+// bits. Otherwise the process ends with status 1 after a message on standard output.
 bool parse_profiler_config(std::string_view argument, std::vector<profiler_config>& configs);
 
 // Sets config to every report and no service of a component. The component "stop" stops the

@@ -1,7 +1,10 @@
+#include <array>
+#include <string_view>
 #include <vector>
 
 #include "nrxctl/base/check.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/text_line.h"
 #include "nrxctl/decoders/record_text.h"
 #include "nrxctl/profiler/apply_configs.h"
 #include "nrxctl/profiler/config_parser.h"
@@ -24,6 +27,16 @@ void print_active_configs(std::span<const profiler_config> configs) {
     print_configs(configs);
 }
 
+struct error_action_row {
+    std::string_view keyword;
+    error_action action;
+};
+
+constexpr std::array error_action_rows{
+    error_action_row{"panic", error_action::panic},
+    error_action_row{"nothing", error_action::nothing},
+};
+
 }  // namespace
 
 void enable(argument_cursor& /*arguments*/) {
@@ -41,6 +54,18 @@ void stop(argument_cursor& /*arguments*/) {
 void flush(argument_cursor& /*arguments*/) {
     if (!fw_profiler_available()) return;
     const platform::return_code kr = flush_fw_profiler();
+    check_success(kr, condition::kr_is_zero);
+}
+
+// A missing argument is invalid, too.
+void set_action_on_error(argument_cursor& arguments) {
+    const std::string_view argument = arguments.next().value_or("");
+    const error_action_row* row = find_keyword(error_action_rows, argument);
+    if (row == nullptr) {
+        print_line(text_line().text("invalid argument: ").text(argument).view());
+        return;
+    }
+    const platform::return_code kr = set_error_action(row->action);
     check_success(kr, condition::kr_is_zero);
 }
 

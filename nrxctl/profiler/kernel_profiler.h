@@ -86,7 +86,7 @@ void read_profiler_log(record_printer print, record_store store = record_store::
 void make_error_dump();
 
 // Asks the driver to end the stream of events, which ends a running monitor. Handles the interrupt
-// signal while a profiler command runs; the command goes on.
+// signal while a profiler command runs; the command continues.
 void stop_on_interrupt();
 
 // Installs stop_on_interrupt for the lifetime of the object, then restores the default action,

@@ -5,9 +5,7 @@
 #include "nrxctl/base/check.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/profile_record.h"
-#include "nrxctl/base/text_line.h"
 #include "nrxctl/decoders/record_text.h"
-#include "nrxctl/profiler/fw_profiler.h"
 #include "nrxctl/profiler/kernel_profiler.h"
 #include "nrxctl/profiler/subcommands.h"
 
@@ -44,16 +42,6 @@ std::optional<log_options> parse_log_options(argument_cursor& arguments) {
     return options;
 }
 
-struct error_action_row {
-    std::string_view keyword;
-    error_action action;
-};
-
-constexpr std::array error_action_rows{
-    error_action_row{"panic", error_action::panic},
-    error_action_row{"nothing", error_action::nothing},
-};
-
 }  // namespace
 
 void signal_error_dump(argument_cursor& /*arguments*/) {
@@ -64,7 +52,7 @@ void show_logs(argument_cursor& arguments) {
     const auto options = parse_log_options(arguments);
     if (!options) {
         print_line("Invalid parameter");
-        check(false, "false");
+        check(false, condition::never);
         return;
     }
     const record_printer print = select_record_printer(options->human);
@@ -78,18 +66,6 @@ void show_logs(argument_cursor& arguments) {
         read_profiler_log(print, record_store::error_dump);
         print_line("\n");
     }
-}
-
-// A missing argument is invalid, too.
-void set_action_on_error(argument_cursor& arguments) {
-    const std::string_view argument = arguments.next().value_or("");
-    const error_action_row* row = find_keyword(error_action_rows, argument);
-    if (row == nullptr) {
-        print_line(text_line().text("invalid argument: ").text(argument).view());
-        return;
-    }
-    const platform::return_code kr = set_error_action(row->action);
-    check_success(kr, condition::kr_is_zero);
 }
 
 }  // namespace nrx::profile

@@ -29,8 +29,8 @@ void monitor_transfers(std::uint32_t duration, std::span<const profiler_config> 
     check(success, condition::success);
 }
 
-// Returns true if the profiler was enabled and must be disabled again. An interrupt is handled
-// until then.
+// Returns true if the profiler was enabled and must be disabled again. Interrupts are handled until
+// this function returns.
 bool run_monitor(std::string_view duration_argument, argument_cursor& arguments) {
     const scoped_interrupt_handler interrupt_handler;
     if (!fw_profiler_available()) {

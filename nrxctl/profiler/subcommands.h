@@ -11,6 +11,7 @@ void enable(argument_cursor& arguments);
 void disable(argument_cursor& arguments);
 void stop(argument_cursor& arguments);
 void flush(argument_cursor& arguments);
+void set_action_on_error(argument_cursor& arguments);
 void configure(argument_cursor& arguments);
 void show_configs(argument_cursor& arguments);
 void monitor(argument_cursor& arguments);
@@ -21,7 +22,6 @@ void run_profile(argument_cursor& arguments);
 // log_subcommands.cpp
 void signal_error_dump(argument_cursor& arguments);
 void show_logs(argument_cursor& arguments);
-void set_action_on_error(argument_cursor& arguments);
 
 // statistics_subcommands.cpp
 void clear_event_source_statistics(argument_cursor& arguments);

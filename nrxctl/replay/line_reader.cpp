@@ -3,6 +3,8 @@
 #include <cstring>
 #include <sys/stat.h>
 
+#include "nrxctl/base/output.h"
+
 namespace nrx {
 
 line_reader::line_reader(const std::string& path, std::size_t capacity)
@@ -33,7 +35,7 @@ std::optional<std::string_view> line_reader::next() {
         }
         scanned_ = end_;
     } while (read_more());
-    // A line that a read error cuts off is no line.
+    // A line cut off by a read error is not returned.
     if (begin_ == end_ || !good()) return std::nullopt;
     return extract_until(end_);
 }
@@ -52,6 +54,7 @@ bool line_reader::read_more() {
     scanned_ -= begin_;
     begin_ = 0;
     if (end_ == buffer_.size()) buffer_.resize(2 * buffer_.size());
+    flush_output();  // the file may be a pipe
     const std::size_t count =
         std::fread(buffer_.data() + end_, 1, buffer_.size() - end_, file_.get());
     end_ += count;

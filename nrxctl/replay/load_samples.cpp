@@ -37,29 +37,29 @@ void print_service_message(std::string_view service, std::string_view message) {
 
 // Arguments of load, and what they mean in the header.
 
-struct option_row {
+struct keyword_value {
     std::string_view keyword;
     std::uint32_t value;
 };
 
 constexpr std::array completions{
-    option_row{"default", 0},
-    option_row{"periodic", 1},
-    option_row{"stop", 2},
-    option_row{"last", 3},
+    keyword_value{"default", 0},
+    keyword_value{"periodic", 1},
+    keyword_value{"stop", 2},
+    keyword_value{"last", 3},
 };
 constexpr std::array locations{
-    option_row{"dram", 1},
-    option_row{"sram", 2},
-    option_row{"local", 2},
+    keyword_value{"dram", 1},
+    keyword_value{"sram", 2},
+    keyword_value{"local", 2},
 };
 
 // Stores the value of an argument; leaves the default if there is no argument. Returns false after
 // "message: argument" as a line if the argument is unknown.
-bool read_option(std::optional<std::string_view> argument, std::span<const option_row> table,
-                 std::string_view message, std::uint32_t& value) {
+bool read_keyword(std::optional<std::string_view> argument, std::span<const keyword_value> table,
+                  std::string_view message, std::uint32_t& value) {
     if (!argument) return true;
-    const option_row* row = find_keyword(table, *argument);
+    const keyword_value* row = find_keyword(table, *argument);
     if (row == nullptr) {
         print_line(text_line().text(message).text(": ").text(*argument).view());
         return false;
@@ -68,31 +68,31 @@ bool read_option(std::optional<std::string_view> argument, std::span<const optio
     return true;
 }
 
-bool read_options(argument_cursor& arguments, replay_load_header& header) {
+bool read_load_arguments(argument_cursor& arguments, replay_load_header& header) {
     auto argument = arguments.next();
     if (argument == "filter") {
         header.filter = 1;
         argument = arguments.next();
     }
-    return read_option(argument, completions, "Invalid completion", header.completion) &&
-           read_option(arguments.next(), locations, "Invalid location", header.location);
+    return read_keyword(argument, completions, "Invalid completion", header.completion) &&
+           read_keyword(arguments.next(), locations, "Invalid location", header.location);
 }
 
-// The outcome of a step of a load. A step that is stopped by a message is not a failure.
-enum class progress { good, stopped, failed };
+// How a step of a load ended. A rejected step has printed a message; it is not a failed check.
+enum class step_result { success, rejected, failed };
 
 // Checks that a service accepts samples.
-progress check_service(const std::string& name) {
+step_result check_service(const std::string& name) {
     const auto entries = replay_status();
     service_id id = 0;
     const bool resolved = resolve_service_id(name, id);
     const auto entry = std::find_if(entries.begin(), entries.end(),
                                     [&](const auto& row) { return row.service_id == id; });
     const bool success = resolved && entry != entries.end();
-    if (!check(success, condition::success)) return progress::failed;
-    if (entry->state == replay_state::inactive) return progress::good;
+    if (!check(success, condition::success)) return step_result::failed;
+    if (entry->state == replay_state::inactive) return step_result::success;
     print_service_message(name, " had already samples; you have to unload first");
-    return progress::stopped;
+    return step_result::rejected;
 }
 
 std::vector<std::uint8_t> make_request(replay_load_header header, const event_list& events) {
@@ -109,32 +109,34 @@ std::vector<std::uint8_t> make_request(replay_load_header header, const event_li
     return request;
 }
 
-progress upload(replay_load_header header, const event_list& events) {
+step_result upload(replay_load_header header, const event_list& events) {
     const std::string name = events.front()->name();
     bool success = resolve_service_id(name, header.service_id);
-    if (!check(success, condition::success)) return progress::failed;
+    if (!check(success, condition::success)) return step_result::failed;
     const auto request = make_request(header, events);
     service_conn conn(replay_app_name);
     success = conn.open();
-    if (!check(success, condition::success)) return progress::failed;
+    if (!check(success, condition::success)) return step_result::failed;
     const platform::return_code kr = call_app(conn, load_method, request);
-    if (!check_success(kr, condition::kr_is_zero)) return progress::failed;
+    if (!check_success(kr, condition::kr_is_zero)) return step_result::failed;
     text_line line;
     line.text(name).text(": loaded ").number(events.size()).text(" events");
     print_line(line.view());
-    return progress::good;
+    return step_result::success;
 }
 
 // Checks every service of the file before it uploads the first, so that a file is rejected as a
 // whole.
-progress load_file(const std::string& path, const replay_load_header& header) {
+step_result load_file(const std::string& path, const replay_load_header& header) {
     const auto groups = read_sample_file(path);
     const bool success = groups.has_value();
-    if (!check(success, condition::success)) return progress::failed;
-    progress state = progress::good;
-    for (auto group = groups->begin(); group != groups->end() && state == progress::good; ++group)
+    if (!check(success, condition::success)) return step_result::failed;
+    step_result state = step_result::success;
+    for (auto group = groups->begin(); group != groups->end() && state == step_result::success;
+         ++group)
         state = check_service(group->first);
-    for (auto group = groups->begin(); group != groups->end() && state == progress::good; ++group)
+    for (auto group = groups->begin(); group != groups->end() && state == step_result::success;
+         ++group)
         state = upload(header, group->second);
     return state;
 }
@@ -158,8 +160,8 @@ void load(argument_cursor& arguments) {
     const auto path = arguments.next();
     if (!check(path, condition::arguments_remain)) return;
     replay_load_header header{};
-    if (!read_options(arguments, header)) return;
-    const bool success = load_file(std::string(*path), header) != progress::failed;
+    if (!read_load_arguments(arguments, header)) return;
+    const bool success = load_file(std::string(*path), header) != step_result::failed;
     check(success, condition::success);
 }
 

@@ -7,7 +7,7 @@
 namespace nrx {
 
 // Runs a subcommand. Its arguments are those of the command line from index on, the option parser's
-// index, which advances with each argument read. An unknown subcommand is answered with the usage.
+// index, which advances with each argument read. An unknown subcommand prints the usage.
 //
 // Prints on standard output. Every failure is a message there or a failure report; there is no
 // result. A malformed number ends the process with status 1, on the command line and in a sample

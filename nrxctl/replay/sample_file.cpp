@@ -14,23 +14,24 @@ namespace nrx {
 namespace {
 
 // An event with a copy of its time stamp, so that sorting touches no event.
-struct dated_event {
+struct timestamped_event {
     std::uint64_t timestamp;
     event_ptr event;
 };
 
 void sort_by_time(event_list& events) {
-    std::vector<dated_event> dated;
+    std::vector<timestamped_event> dated;
     dated.reserve(events.size());
     for (event_ptr& event : events) {
         const std::uint64_t timestamp = event->timestamp();
         dated.push_back({timestamp, std::move(event)});
     }
-    std::stable_sort(dated.begin(), dated.end(), [](const dated_event& a, const dated_event& b) {
-        return a.timestamp < b.timestamp;
-    });
+    std::stable_sort(dated.begin(), dated.end(),
+                     [](const timestamped_event& a, const timestamped_event& b) {
+                         return a.timestamp < b.timestamp;
+                     });
     std::transform(dated.begin(), dated.end(), events.begin(),
-                   [](dated_event& sorted) { return std::move(sorted.event); });
+                   [](timestamped_event& sorted) { return std::move(sorted.event); });
 }
 
 void set_delta(VirtualEvent& event, std::uint64_t previous) {
@@ -38,12 +39,12 @@ void set_delta(VirtualEvent& event, std::uint64_t previous) {
 }
 
 // Fills the list of a service and sets deltas while each event is in the cache: a second pass over
-// millions of events would take a tenth of the time of reading them.
+// millions of events would add a tenth to the reading time.
 class group_filler {
 public:
-    // Fills an empty list, which must outlive this object, with about that many events at most.
-    // Reserved storage that stays unused is not backed by memory, but storage that grows is, twice.
-    // The bound is for files whose size is misleading.
+    // Fills an empty list, which must outlive this object. expected is an upper estimate of its
+    // size. Unused reserved storage costs no memory, whereas growing copies the list. The limit
+    // guards against a misleading file size.
     group_filler(event_list& events, std::size_t expected) : events_(&events) {
         constexpr std::size_t max_expected = std::size_t{1} << 22;
         events.reserve(std::min(expected, max_expected));
@@ -160,18 +161,19 @@ private:
 }  // namespace
 
 std::optional<sample_groups> read_sample_file(const std::string& path) {
-    line_reader fs(path);
-    sample_collector collector(fs.file_size());
+    const block_output blocks;
+    line_reader reader(path);
+    sample_collector collector(reader.file_size());
     for (;;) {
-        if (const std::size_t length = collector.try_pattern(fs.buffered())) {
-            fs.consume(length);
+        if (const std::size_t length = collector.try_pattern(reader.buffered())) {
+            reader.consume(length);
             continue;
         }
-        const auto line = fs.next();
+        const auto line = reader.next();
         if (!line) break;
         if (!check(collector.add(*line), "pair.size() == 2")) return std::nullopt;
     }
-    if (!check(fs.good(), "fs")) return std::nullopt;
+    if (!check(reader.good(), "fs")) return std::nullopt;
     return collector.finish();
 }
 

@@ -53,7 +53,8 @@ bool split_sample_line(std::string_view line, sample_line& split) {
     std::size_t begin = std::min(line.find(','), line.size());
     split.tag = line.substr(0, begin++);
     split.values.clear();
-    // Each equals sign is searched for once: one after the end of a field belongs to a later field.
+    // Each equals sign is searched for once: a sign found past the end of the current field is kept
+    // for a later one.
     std::size_t equals_sign = line.find('=', begin);
     while (begin < line.size()) {
         const std::size_t end = std::min(line.find(',', begin), line.size());

@@ -10,9 +10,9 @@
 namespace nrx {
 
 // The keys that events read.
-enum class sample_key : std::uint8_t { sampleid, temperature, x, y, z, p, timestamp, shake };
+enum class sample_key : std::uint8_t { sampleid, temperature, x, y, z, p, timestamp, shake, count };
 
-inline constexpr std::size_t sample_key_count = static_cast<std::size_t>(sample_key::shake) + 1;
+inline constexpr auto sample_key_count = static_cast<std::size_t>(sample_key::count);
 
 // Returns the key with that name, or nullopt if no event reads it.
 std::optional<sample_key> find_sample_key(std::string_view name);

@@ -100,9 +100,9 @@ std::int32_t step_value(const signal_sample& sample) {
 }
 
 std::int32_t sine_value(const signal_sample& sample) {
-    constexpr double full_turn = 6.283185307179586;
+    constexpr double two_pi = 6.283185307179586;
     if (sample.count == 0) return 0;
-    const double angle = full_turn / sample.count * sample.number;
+    const double angle = two_pi / sample.count * sample.number;
     return static_cast<std::int32_t>(std::sin(angle) * q16_16_one);
 }
 

@@ -55,7 +55,7 @@ public:
     // Adds an object and returns its new handle.
     handle_id insert(object added);
 
-    // The object of the given type behind a handle; null if there is none. The pointer is valid
+    // The object of the given type of a handle; null if there is none. The pointer is valid
     // until the table changes.
     template <class Object>
     [[nodiscard]] Object* find(handle_id id) {
@@ -63,7 +63,7 @@ public:
         return match == nullptr ? nullptr : std::get_if<Object>(match);
     }
 
-    // Removes the object behind a handle, if there is one.
+    // Removes the object of a handle, if there is one.
     void erase(handle_id id);
 
     // Number of objects, plus the number of HID devices that are open, including devices whose

@@ -16,7 +16,7 @@ using simulated::machine_clock;
 
 namespace {
 
-// 24 ticks per microsecond, so that code that mistakes ticks for another unit is found out.
+// 24 ticks per microsecond, so that code that mistakes ticks for another unit is detected.
 using tick = std::chrono::duration<std::uint64_t, std::ratio<1, 24'000'000>>;
 
 std::uint64_t ticks_at(machine_clock::time instant) {

@@ -35,11 +35,12 @@ bool has_name(const entry& candidate, std::string_view /*key*/, const property& 
 }
 
 bool has_properties(const entry& candidate, std::string_view /*key*/, const property& expected) {
-    const dictionary* all = expected.entries();
-    return all != nullptr && std::all_of(all->entries().begin(), all->entries().end(),
-                                         [&](const dictionary_entry& row) {
-                                             return has_property(candidate, row.key, row.value);
-                                         });
+    const dictionary* properties = expected.entries();
+    return properties != nullptr &&
+           std::all_of(properties->entries().begin(), properties->entries().end(),
+                       [&](const dictionary_entry& row) {
+                           return has_property(candidate, row.key, row.value);
+                       });
 }
 
 // Returns true if the device has any of the expected usage pairs.

@@ -77,7 +77,7 @@ public:
     // Adds an object and returns its handle.
     handle_id open_object(handle_table::object added) { return handles_.insert(std::move(added)); }
 
-    // The object of the given type behind a handle; null if there is none. The pointer is valid
+    // The object of the given type of a handle; null if there is none. The pointer is valid
     // until an object is opened or released.
     template <class Object>
     [[nodiscard]] Object* find_object(handle_id id) {

@@ -33,11 +33,11 @@ bool machine_clock::advance(std::optional<time> deadline) {
 bool machine_clock::advance_manually(std::optional<time> deadline) {
     const auto next = std::min_element(
         timed_actions_.begin(), timed_actions_.end(),
-        [](const timed_action& a, const timed_action& b) { return a.when < b.when; });
-    if (next != timed_actions_.end() && (!deadline || next->when <= *deadline)) {
+        [](const timed_action& a, const timed_action& b) { return a.due < b.due; });
+    if (next != timed_actions_.end() && (!deadline || next->due <= *deadline)) {
         const timed_action due = std::move(*next);
         timed_actions_.erase(next);
-        manual_now_ = std::max(manual_now_, due.when);
+        manual_now_ = std::max(manual_now_, due.due);
         due.run();
         return true;
     }

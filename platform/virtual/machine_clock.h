@@ -33,13 +33,13 @@ public:
     bool advance(std::optional<time> deadline);
 
     // Runs an action when the manual clock reaches the given time.
-    void run_at(time when, std::function<void()> action) {
-        timed_actions_.push_back({when, std::move(action)});
+    void run_at(time due, std::function<void()> action) {
+        timed_actions_.push_back({due, std::move(action)});
     }
 
 private:
     struct timed_action {
-        time when;
+        time due;
         std::function<void()> run;
     };
 

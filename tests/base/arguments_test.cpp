@@ -9,7 +9,7 @@ namespace tests {
 TEST(argument_cursor, reads_in_order_and_advances_the_index) {
     const argument_vector arguments({"program", "one", ""});
     int index = 1;
-    nrx::argument_cursor cursor(arguments.all(), index);
+    nrx::argument_cursor cursor(arguments.span(), index);
     EXPECT_EQ(cursor.next(), "one");
     EXPECT_EQ(index, 2);
     // The option's own argument comes first and does not move the index.
@@ -30,7 +30,7 @@ TEST(argument_cursor, index_outside_the_arguments_is_the_end) {
     const argument_vector arguments({"one"});
     for (int index : {-1, 1, 7}) {
         const int before = index;
-        nrx::argument_cursor cursor(arguments.all(), index);
+        nrx::argument_cursor cursor(arguments.span(), index);
         EXPECT_EQ(cursor.remaining(), 0U);
         EXPECT_EQ(cursor.next(), std::nullopt);
         EXPECT_EQ(index, before);

@@ -90,7 +90,7 @@ protected:
     };
 };
 
-TEST_F(driver_calls, find_open_call_close_and_release) {
+TEST_F(driver_calls, find_open_call_close_and_release_in_that_order) {
     for (const operation& operation : operations) {
         const bool is_hid = operation.call.starts_with("call KeltoNRXHIDDriver ");
         const auto before = static_cast<std::ptrdiff_t>(host.log().size());

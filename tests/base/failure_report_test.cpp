@@ -53,7 +53,7 @@ TEST(failure_report, ends_with_the_text_of_the_code_and_its_32_bit_pattern) {
     }
 }
 
-TEST(check, answers_whether_it_holds_and_names_the_line_where_it_stands) {
+TEST(check, returns_whether_it_holds_and_names_its_source_line) {
     const std::vector<std::uint8_t> short_reply(1);
     const auto held = capture([] {
         EXPECT_TRUE(nrx::check(true, "service"));

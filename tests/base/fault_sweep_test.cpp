@@ -32,41 +32,32 @@ platform::byte_span& reply() {
     return span = buffer;
 }
 
-struct sweep_row {
-    std::function<void()> operation;
-    std::function<bool(const fault&)> acceptable = is_reported;
-};
-
-TEST(base_fault_sweep, channel_operations_connections_and_records) {
+TEST(base_fault_sweep, every_failed_call_of_a_driver_is_reported) {
     const byte_list value{1};
-    const std::vector<sweep_row> operations{
-        {[] { nrx::get_report("accel", 0xd0, reply()); }},
-        {[&] { nrx::set_report("accel", 0xd0, value); }},
-        {[&] { nrx::send_command("accel", 0x20, value, reply()); }},
-        {[] { nrx::call_scalar_method("accel", {}); }},
-        {[&] { nrx::set_named_property("accel", "gain", value); }},
-        {[] { nrx::get_named_property("accel", "gain", reply()); }},
-        {[&] { nrx::call_hid_driver(value, reply()); }},
-        {[] { nrx::switch_mca(true); }},
-        {[] { nrx::switch_mca(false); }},
-        {[] { nrx::read_profile_records([](const nrx::profile_record&) {}); }},
-        {[] { nrx::service_conn("NRXApp").open(); },
-         [](const fault& fault) { return !fault.result.err.empty(); }},
-        // Probing reports a failed open and nothing else.
-        {[] { nrx::get_report_quiet("accel", 0xd0, reply()); },
-         [](const fault& fault) {
-             return fault.result.err.empty() != fault.name.starts_with("open ");
-         }},
-        {[&] { nrx::send_command("31", 0x20, value, reply(), nrx::on_failure::ignore); },
-         [](const fault& fault) {
-             return fault.result.err.empty() == fault.name.starts_with("call ");
-         }},
-    };
-    for (const auto& [operation, acceptable] : operations)
-        sweep_faults(make_host, operation, acceptable);
+    const std::string prefixed = "IONameMatch = \"WQR_";
+    sweep_faults(make_host,
+                 {{[] { nrx::get_report("accel", 0xd0, reply()); }, prefixed},
+                  {[&] { nrx::set_report("accel", 0xd0, value); }, prefixed},
+                  {[&] { nrx::send_command("accel", 0x20, value, reply()); }, prefixed},
+                  {[] { nrx::call_scalar_method("accel", {}); }, prefixed},
+                  {[&] { nrx::set_named_property("accel", "gain", value); }, prefixed},
+                  {[] { nrx::get_named_property("accel", "gain", reply()); }, prefixed},
+                  {[&] { nrx::call_hid_driver(value, reply()); }},
+                  {[] { nrx::switch_mca(true); }, prefixed},
+                  {[] { nrx::switch_mca(false); }, prefixed},
+                  {[] { nrx::read_profile_records([](const nrx::profile_record&) {}); }, prefixed},
+                  {[] { nrx::service_conn("NRXApp").open(); }},
+                  {[&] { nrx::send_command("31", 0x20, value, reply(), nrx::on_failure::ignore); },
+                   "^call "}});
+    // Probing reports a failed open and nothing else.
+    sweep_faults(
+        make_host, [] { nrx::get_report_quiet("accel", 0xd0, reply()); },
+        [](const fault& fault) {
+            return fault.result.err.empty() != fault.name.starts_with("open ");
+        });
 }
 
-TEST(base_fault_sweep, discovery_and_properties) {
+TEST(base_fault_sweep, every_failed_call_of_discovery_is_reported) {
     std::string name;
     nrx::service_id id = 0;
     const platform::property value(5);
@@ -83,7 +74,11 @@ TEST(base_fault_sweep, discovery_and_properties) {
             return is_empty || fault.result.err.find("Assertion failed") != std::string::npos;
         };
     };
-    const std::vector<sweep_row> operations{
+    struct row {
+        std::function<void()> operation;
+        std::function<bool(const fault&)> acceptable;
+    };
+    const std::vector<row> operations{
         {[] { nrx::find_hid_device("accel"); }, missing_interface},
         {[&] { nrx::resolve_service_id("accel", id); }, missing_interface},
         {[&] { nrx::service_name_for_id(31, name); }, reported_unless_empty("name of accel")},

@@ -46,16 +46,16 @@ const std::vector<sequence> sequences{
 
 using mca = device_test;
 
-TEST_F(mca, first_failed_step_ends_the_sequence_and_is_reported_twice) {
+TEST_F(mca, first_failed_step_ends_the_sequence_and_is_reported_reports) {
     add_base_services(host);
-    const std::string twice = library_report(source_file::command_channel, "kr == 0 ", io_text) +
-                              library_report(source_file::mca, "kr == 0 ", io_text);
+    const std::string reports = library_report(source_file::command_channel, "kr == 0 ", io_text) +
+                                library_report(source_file::mca, "kr == 0 ", io_text);
     for (const auto& [on, steps] : sequences) {
         auto seen = static_cast<std::ptrdiff_t>(logged_calls("call").size());
         const auto calls = [&] {
-            const lines all = logged_calls("call");
-            lines added(all.begin() + seen, all.end());
-            seen = static_cast<std::ptrdiff_t>(all.size());
+            const lines calls_so_far = logged_calls("call");
+            lines added(calls_so_far.begin() + seen, calls_so_far.end());
+            seen = static_cast<std::ptrdiff_t>(calls_so_far.size());
             return added;
         };
         EXPECT_EQ(switch_mca(on, platform::success), "");
@@ -63,7 +63,7 @@ TEST_F(mca, first_failed_step_ends_the_sequence_and_is_reported_twice) {
         for (std::size_t step = 1; step <= steps.size(); ++step) {
             // Each step makes four platform calls: two look-ups, an open, a call.
             host.fail_call(4 * step, failure::io);
-            EXPECT_EQ(switch_mca(on, platform::simulated::io_failure), twice) << step;
+            EXPECT_EQ(switch_mca(on, platform::simulated::io_failure), reports) << step;
             EXPECT_EQ(calls().size(), step);
         }
     }

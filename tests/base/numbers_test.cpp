@@ -19,33 +19,33 @@ namespace {
 TEST(parse_number, reads_decimal_and_prefixed_hexadecimal) {
     using row = std::pair<std::string, std::int64_t>;
     constexpr auto max = std::numeric_limits<std::int64_t>::max();
-    for (const auto& [word, value] :
+    for (const auto& [argument, value] :
          {row{"0", 0}, row{"7", 7}, row{"+7", 7}, row{"-7", -7}, row{"007", 7}, row{"0x1f", 31},
           row{"-0x10", -16}, row{"+0xAb", 171}, row{"0x0", 0}, row{"0x7fffffffffffffff", max},
           row{"0x0123456789abcdEF", 0x0123456789abcdef}, row{"9223372036854775807", max},
           row{"-9223372036854775807", -max}})
-        EXPECT_EQ(nrx::parse_number(word, "bad"), value) << word;
+        EXPECT_EQ(nrx::parse_number(argument, "bad"), value) << argument;
 }
 
-TEST(parse_number, ends_the_process_with_the_message_and_the_word) {
-    for (const std::string& word :
+TEST(parse_number, rejects_an_invalid_number_with_message_and_argument) {
+    for (const std::string& argument :
          split(",12a,a,-,+,--5,+-5,- 5, 5,5 ,1.5,0x,-0x,0X1f,0x1g,0x-1,0x+1,0x 1,x1,5:,5/,0x5G,"
                "0x5@,0x5`,9223372036854775808,-9223372036854775808,0x8000000000000000,"
                "0x10000000000000000",
                ',')) {
-        const auto refused = capture([&] { nrx::parse_number(word, "duration is invalid"); });
-        EXPECT_EQ(refused.status, 1) << word;
-        EXPECT_EQ(refused.out, "duration is invalid (" + word + ")\n");
+        const auto refused = capture([&] { nrx::parse_number(argument, "duration is invalid"); });
+        EXPECT_EQ(refused.status, 1) << argument;
+        EXPECT_EQ(refused.out, "duration is invalid (" + argument + ")\n");
         EXPECT_EQ(refused.err, "");
     }
 }
 
-TEST(parse_number, up_to_a_maximum_rejects_what_is_outside) {
+TEST(parse_number, with_a_maximum_rejects_numbers_out_of_range) {
     EXPECT_EQ(nrx::parse_number_up_to(200, "-0", "bad"), 0U);
     EXPECT_EQ(nrx::parse_number_up_to(200, "200", "bad"), 200U);
-    for (const std::string word : {"-1", "201", "4294967296"})
-        EXPECT_EQ(capture([&] { nrx::parse_number_up_to(200, word, "bad"); }).out,
-                  "bad (" + word + ")\n");
+    for (const std::string argument : {"-1", "201", "4294967296"})
+        EXPECT_EQ(capture([&] { nrx::parse_number_up_to(200, argument, "bad"); }).out,
+                  "bad (" + argument + ")\n");
 }
 
 struct packed {
@@ -55,10 +55,10 @@ struct packed {
     bool operator==(const packed&) const = default;
 };
 
-packed pack(std::vector<std::string> words, int position = 0) {
-    const argument_vector all(std::move(words));
+packed pack(std::vector<std::string> arguments, int position = 0) {
+    const argument_vector command_line(std::move(arguments));
     packed result{position, {0xee}};
-    nrx::parse_payload(all.all(), result.position, result.payload);
+    nrx::parse_payload(command_line.span(), result.position, result.payload);
     return result;
 }
 
@@ -90,12 +90,12 @@ TEST(parse_payload, rejects_values_beyond_the_width_or_32_bits) {
         {{"u32", "0d-1"},
          "Value -1 (0ffffffffffffffff) is bigger than allowed (4294967295, 0xffffffff)\n"},
     };
-    for (const std::string word :
+    for (const std::string argument :
          {"", "xyz", "0d", "0dff", "0d1.5", "0x", "0x-5", "1 2", "80000000", "0d2147483648",
           "0d-2147483649", "0d--1", "123456789012345678901"})
-        cases.push_back({{"u32", word}, "payload value is invalid (" + word + ")\n"});
-    for (const auto& [words, message] : cases) {
-        const auto refused = capture([&packed_words = words] { pack(packed_words); });
+        cases.push_back({{"u32", argument}, "payload value is invalid (" + argument + ")\n"});
+    for (const auto& [arguments, message] : cases) {
+        const auto refused = capture([&values = arguments] { pack(values); });
         EXPECT_EQ(refused.status, 1);
         EXPECT_EQ(refused.out, message);
     }

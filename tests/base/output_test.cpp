@@ -144,9 +144,9 @@ TEST(scoped_sink, redirects_one_stream_until_it_is_destroyed) {
 }
 
 TEST(block_output, is_written_before_errors_and_waits) {
-    recording_sink both;
-    const nrx::scoped_sink installed_out(nrx::standard_stream::output, both);
-    const nrx::scoped_sink installed_err(nrx::standard_stream::error, both);
+    recording_sink sink;
+    const nrx::scoped_sink installed_out(nrx::standard_stream::output, sink);
+    const nrx::scoped_sink installed_err(nrx::standard_stream::error, sink);
     {
         const nrx::block_output blocks;
         nrx::print_line("one");
@@ -154,11 +154,11 @@ TEST(block_output, is_written_before_errors_and_waits) {
         nrx::write_error("error\n");
         nrx::print_line("three");
         nrx::flush_output();
-        EXPECT_EQ(both.writes.size(), 3U);
+        EXPECT_EQ(sink.writes.size(), 3U);
         nrx::print_line("four");
     }
     nrx::print_line("five");
-    EXPECT_EQ(both.writes, (strings{"one\ntwo\n", "error\n", "three\n", "four\n", "five\n"}));
+    EXPECT_EQ(sink.writes, (strings{"one\ntwo\n", "error\n", "three\n", "four\n", "five\n"}));
 }
 
 // Redirects a standard stream to a new pseudo-terminal.
@@ -214,29 +214,36 @@ TEST_F(program_output, device_name_cannot_set_the_title_of_a_terminal) {
     EXPECT_EQ(file.out.substr(0, 10), "\x1b]0;title\a");
 }
 
-TEST(utf8, is_valid_only_in_well_formed_sequences) {
-    const rows<std::string, bool> cases{
-        {"", true},
-        {"plain \x7f", true},
-        {"\xc2\x80\xdf\xbf", true},
-        {"\xe0\xa0\x80\xec\xbf\xbf\xed\x80\x80\xed\x9f\xbf\xee\x80\x80\xef\xbf\xbf", true},
-        {"\xf0\x90\x80\x80\xf1\x80\x80\x80\xf3\xbf\xbf\xbf\xf4\x8f\xbf\xbf", true},
-        {"\x80", false},
-        {"\xc1\xbf", false},
-        {"\xc2", false},
-        {"\xdf\xc0", false},
-        {"\xe0\x9f\xbf", false},
-        {"\xe1\x80", false},
-        {"\xed\xa0\x80", false},
-        {"\xf0\x8f\xbf\xbf", false},
-        {"\xf1\x7f\x80\x80", false},
-        {"\xf1\x80\xc0\x80", false},
-        {"\xf1\x80\x80\x7f", false},
-        {"\xf4\x90\x80\x80", false},
-        {"\xf5\x80\x80\x80", false},
+TEST(utf8, accepts_well_formed_sequences_only) {
+    // The first bytes of a sequence, the second bytes that may follow, and how many bytes follow
+    // these.
+    const rows<int, int, int, int, std::size_t> sequences{
+        {0xc2, 0xdf, 0x80, 0xbf, 0}, {0xe0, 0xe0, 0xa0, 0xbf, 1}, {0xe1, 0xec, 0x80, 0xbf, 1},
+        {0xed, 0xed, 0x80, 0x9f, 1}, {0xee, 0xef, 0x80, 0xbf, 1}, {0xf0, 0xf0, 0x90, 0xbf, 2},
+        {0xf1, 0xf3, 0x80, 0xbf, 2}, {0xf4, 0xf4, 0x80, 0x8f, 2},
     };
-    for (const auto& [text, valid] : cases)
-        EXPECT_EQ(nrx::is_utf8(text), valid) << ::testing::PrintToString(text);
+    for (int first = 0x80; first <= 0xff; ++first) {
+        for (int second = 0; second <= 0xff; ++second) {
+            for (std::size_t further = 0; further <= 2; ++further) {
+                bool is_well_formed = false;
+                for (const auto& [first_min, first_max, min, max, count] : sequences) {
+                    is_well_formed |= first_min <= first && first <= first_max && min <= second &&
+                                      second <= max && further == count;
+                }
+                std::string text{static_cast<char>(first), static_cast<char>(second)};
+                text.append(further, '\xbf');
+                EXPECT_EQ(nrx::is_utf8(text), is_well_formed) << first << " " << second;
+            }
+        }
+    }
+    for (const char* text : {"", "\x7f plain", "seventeen letters\xc3\xa9 and more", "\xe1\x80\x80",
+                             "\xf1\x80\x80\x80"})
+        EXPECT_TRUE(nrx::is_utf8(text)) << text;
+    for (const char* text : {"\xc2", "\xe1\x80\x7f", "\xe1\x80\xc0", "\xf1\x80\x7f\x80",
+                             "\xf1\x80\xc0\x80", "\xf1\x80\x80\x7f", "\xf1\x80\x80\xc0",
+                             "a\xc3\xa9\x80", "seventeen letters\xc3 and more"}) {
+        EXPECT_FALSE(nrx::is_utf8(text)) << text;
+    }
 }
 
 }  // namespace

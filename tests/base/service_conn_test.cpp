@@ -17,7 +17,7 @@ protected:
         host.add({.name = "client", .driver = std::make_shared<interface_driver>()}, app);
     }
 
-    // Fails to open a connection that then holds this many handles. Returns the failure report.
+    // Opens a connection, which must fail and hold this many handles. Returns the failure report.
     std::string fail_to_open(on_failure on_missing, std::size_t handles) {
         return capture([&] {
                    nrx::service_conn conn("NRXApp");
@@ -43,7 +43,7 @@ TEST_F(service_conn, opens_the_first_child_and_releases_everything) {
                                         "close client", "release client", "release NRXApp"}));
 }
 
-TEST_F(service_conn, failed_step_is_reported_but_a_missing_service_if_ignored) {
+TEST_F(service_conn, failed_step_is_reported_unless_a_missing_service_is_ignored) {
     host.add({.name = "WQR_NRXApp"});
     EXPECT_EQ(fail_to_open(on_failure::report, 0), library_report(file, "service"));
     EXPECT_EQ(fail_to_open(on_failure::ignore, 0), "");

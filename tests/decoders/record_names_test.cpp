@@ -24,7 +24,7 @@ std::string names(const std::string& key, std::uint8_t record_ids::*member, reco
     return all;
 }
 
-TEST_F(record_names, every_value_of_category_and_type) {
+TEST_F(record_names, every_category_and_type_prints_its_name_or_number) {
     for (const std::uint8_t other : {std::uint8_t{0}, std::uint8_t{255}}) {
         EXPECT_EQ(names("category", &record_ids::category, {0, other, other, other}),
                   "0 exec 1 trace 2 sensor 3 orrin 4 talvor 5 interrupt 6 uart 8 control 9 scm "
@@ -36,7 +36,7 @@ TEST_F(record_names, every_value_of_category_and_type) {
     }
 }
 
-TEST_F(record_names, every_component_and_event_of_every_category) {
+TEST_F(record_names, every_component_and_event_prints_its_name_or_number) {
     const std::string commands =
         "0 start 1 finalize 2 new-packet 3 receive 4 timeout 5 live-report 6 hist-report "
         "7 user-report ";
@@ -75,7 +75,7 @@ TEST_F(record_names, every_component_and_event_of_every_category) {
     }
 }
 
-TEST(category_decoders, exist_for_all_but_seven_and_name_any_number) {
+TEST(category_decoders, exist_for_every_category_up_to_10_but_7) {
     for (std::uint32_t category = 0; category < 300; ++category) {
         const bool exists = category <= 10 && category != 7;
         EXPECT_EQ(nrx::decoder_for_category(category) != nullptr, exists) << category;

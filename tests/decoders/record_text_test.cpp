@@ -147,36 +147,27 @@ TEST_F(record_text, is_printed_only_if_it_is_utf8) {
         EXPECT_EQ(printed(name), "");
 }
 
-TEST(utf8, accepts_well_formed_sequences_only) {
-    // The first bytes of a sequence, the second bytes that may follow, and how many bytes follow
-    // these.
-    const rows<int, int, int, int, std::size_t> sequences{
-        {0xc2, 0xdf, 0x80, 0xbf, 0}, {0xe0, 0xe0, 0xa0, 0xbf, 1}, {0xe1, 0xec, 0x80, 0xbf, 1},
-        {0xed, 0xed, 0x80, 0x9f, 1}, {0xee, 0xef, 0x80, 0xbf, 1}, {0xf0, 0xf0, 0x90, 0xbf, 2},
-        {0xf1, 0xf3, 0x80, 0xbf, 2}, {0xf4, 0xf4, 0x80, 0x8f, 2},
-    };
-    for (int first = 0x80; first <= 0xff; ++first) {
-        for (int second = 0; second <= 0xff; ++second) {
-            for (std::size_t further = 0; further <= 2; ++further) {
-                bool is_well_formed = false;
-                for (const auto& [first_min, first_max, min, max, count] : sequences) {
-                    is_well_formed |= first_min <= first && first <= first_max && min <= second &&
-                                      second <= max && further == count;
-                }
-                std::string text{static_cast<char>(first), static_cast<char>(second)};
-                text.append(further, '\xbf');
-                EXPECT_EQ(nrx::is_utf8(text), is_well_formed) << first << " " << second;
-            }
-        }
-    }
-    for (const char* text : {"", "\x7f plain", "seventeen letters\xc3\xa9 and more", "\xe1\x80\x80",
-                             "\xf1\x80\x80\x80"})
-        EXPECT_TRUE(nrx::is_utf8(text)) << text;
-    for (const char* text : {"\xc2", "\xe1\x80\x7f", "\xe1\x80\xc0", "\xf1\x80\x7f\x80",
-                             "\xf1\x80\xc0\x80", "\xf1\x80\x80\x7f", "\xf1\x80\x80\xc0",
-                             "a\xc3\xa9\x80", "seventeen letters\xc3 and more"}) {
-        EXPECT_FALSE(nrx::is_utf8(text)) << text;
-    }
+std::string dumped(std::string_view label, const std::vector<std::uint8_t>& bytes, int spaced) {
+    return capture([&] { nrx::nrx_profile_hexdump(label, bytes, spaced); }).out;
+}
+
+TEST(profile_hexdump, a_space_follows_each_byte_only_if_spaced_is_1) {
+    EXPECT_EQ(dumped("x: ", {0x00, 0x9f, 0xff}, 1), "x: 00 9f ff \n");
+    EXPECT_EQ(dumped("x: ", {0x00, 0x9f, 0xff}, 0), "x: 009fff\n");
+    EXPECT_EQ(dumped("x: ", {0x12}, 2), "x: 12\n");
+    EXPECT_EQ(dumped("x: ", {0x12}, -1), "x: 12\n");
+    EXPECT_EQ(dumped("", {}, 1), "\n");
+}
+
+TEST(profile_hexdump, a_line_too_long_stops_the_process) {
+    EXPECT_EQ(dumped("ab", std::vector<std::uint8_t>(84), 1).size(), 2U + 84 * 3 + 1);
+    EXPECT_EQ(dumped(std::string(254, 'l'), {}, 0).size(), 255U);
+    const std::string report =
+        std::string(source_file::record_text) +
+        ":[0-9]+: nrx_profile_hexdump: Assertion "
+        "`\\(strlen\\(label\\) \\+ 3\\*bufLen \\+ 1\\) < sizeof\\(line\\)' failed\\.";
+    EXPECT_DEATH(nrx::nrx_profile_hexdump("abc", std::vector<std::uint8_t>(84), 1), report);
+    EXPECT_DEATH(nrx::nrx_profile_hexdump(std::string(255, 'l'), {}, 0), report);
 }
 
 }  // namespace

@@ -85,7 +85,7 @@ TEST_F(record_times, calendar_time_is_that_of_the_zone_set_last) {
     }
 }
 
-TEST_F(record_times, the_first_second_of_1970_may_be_the_first_of_a_thread) {
+TEST_F(record_times, first_second_of_1970_is_converted_without_a_cached_text) {
     publish(dictionary{{"nrx", 0}, {"calendar", 0}});
     std::string shown;
     std::thread([&] { shown = time_of(7); }).join();
@@ -105,7 +105,7 @@ TEST_F(record_times, without_a_complete_sync_point_there_is_no_calendar_time) {
     EXPECT_EQ(time_of(1), "Jan 01 00:00:00.000001");
 }
 
-TEST_F(record_times, follow_the_bytes_and_are_left_out_silently_if_a_call_fails) {
+TEST_F(record_times, come_last_and_are_omitted_if_a_call_fails) {
     const auto make_host = [] {
         auto device = std::make_unique<machine>();
         add_time_sync(*device, [] { return sync_point{0, 0}; });
@@ -123,9 +123,9 @@ TEST_F(record_times, follow_the_bytes_and_are_left_out_silently_if_a_call_fails)
     }
     sweep_faults(
         make_host, [&] { nrx::print_profile_record(record); },
-        [&](const fault& one) {
-            return one.result.err.empty() &&
-                   one.result.out.ends_with(end + (one.call == 3 ? calendar : boot) + "}\n");
+        [&](const fault& fault) {
+            return fault.result.err.empty() &&
+                   fault.result.out.ends_with(end + (fault.call == 3 ? calendar : boot) + "}\n");
         });
 }
 

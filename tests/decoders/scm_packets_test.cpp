@@ -82,27 +82,4 @@ TEST(scm_packets, other_records_print_nothing_and_change_nothing) {
     expect_printed(records);
 }
 
-std::string dumped(std::string_view label, const std::vector<std::uint8_t>& bytes, int spaced) {
-    return capture([&] { nrx::nrx_profile_hexdump(label, bytes, spaced); }).out;
-}
-
-TEST(profile_hexdump, a_space_follows_each_byte_only_if_spaced_is_1) {
-    EXPECT_EQ(dumped("x: ", {0x00, 0x9f, 0xff}, 1), "x: 00 9f ff \n");
-    EXPECT_EQ(dumped("x: ", {0x00, 0x9f, 0xff}, 0), "x: 009fff\n");
-    EXPECT_EQ(dumped("x: ", {0x12}, 2), "x: 12\n");
-    EXPECT_EQ(dumped("x: ", {0x12}, -1), "x: 12\n");
-    EXPECT_EQ(dumped("", {}, 1), "\n");
-}
-
-TEST(profile_hexdump, a_line_too_long_stops_the_process) {
-    EXPECT_EQ(dumped("ab", std::vector<std::uint8_t>(84), 1).size(), 2U + 84 * 3 + 1);
-    EXPECT_EQ(dumped(std::string(254, 'l'), {}, 0).size(), 255U);
-    const std::string report =
-        std::string(source_file::record_text) +
-        ":[0-9]+: nrx_profile_hexdump: Assertion "
-        "`\\(strlen\\(label\\) \\+ 3\\*bufLen \\+ 1\\) < sizeof\\(line\\)' failed\\.";
-    EXPECT_DEATH(nrx::nrx_profile_hexdump("abc", std::vector<std::uint8_t>(84), 1), report);
-    EXPECT_DEATH(nrx::nrx_profile_hexdump(std::string(255, 'l'), {}, 0), report);
-}
-
 }  // namespace

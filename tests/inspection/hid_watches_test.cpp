@@ -5,6 +5,7 @@
 #include <sstream>
 
 #include "nrxctl/base/clock_references.h"
+#include "nrxctl/base/output.h"
 #include "nrxctl/inspection/hid_event_state.h"
 #include "nrxctl/inspection/hid_event_watch.h"
 #include "nrxctl/inspection/hid_events.h"
@@ -224,6 +225,25 @@ TEST_F(hid_event_watch, failed_step_is_reported_and_ends_the_watch) {
         EXPECT_EQ(report_of(platform::simulated::io_failure, watch),
                   library_report(file, "kr == 0 ", io_text));
         EXPECT_EQ(host.calls_made() - previous, call);
+    }
+}
+
+TEST_F(hid_event_watch, and_spi_watch_flush_output_before_they_wait) {
+    set_hid_events_script(host, {});
+    add_hid_device(host, "accel-hid", 16);
+    for (const auto& watch : std::vector<std::function<void()>>{
+             [] { nrx::watch_hid_events(5s); }, [] { nrx::watch_spi_status(16, 1); }}) {
+        nrx::memory_sink target;
+        const nrx::scoped_sink installed(nrx::standard_stream::output, target);
+        const nrx::block_output blocks;
+        nrx::print_line("buffered");
+        std::string seen;
+        host.clock().run_at(host.clock().now() + 1s, [&] {
+            seen = target.text();
+            platform::stop_loop();
+        });
+        watch();
+        EXPECT_TRUE(seen.starts_with("buffered\n"));
     }
 }
 

@@ -95,7 +95,7 @@ const std::string rates = "100.00 200.00 333333.33 ";
 const std::string location = "'L' alternate=-65536";
 const std::string full_text = "0123456789abcdef0123456789ABCDEF";
 
-TEST_F(sensor_info, boundary_values_and_short_replies_of_properties) {
+TEST_F(sensor_info, properties_at_boundaries_and_cut_short_print_defaults) {
     expect_changes(
         "accel", {{0x00, numbers({0xffffffff}), interval, "unsupported"},
                   {0x00, numbers({INT32_MIN}), "10000 us", "-2147483648 us"},
@@ -251,7 +251,7 @@ void expect_block(const std::string& block, const std::string& text, number_base
     EXPECT_EQ(base, base_after) << text;
 }
 
-TEST(extra_info, items_print_one_after_the_other_up_to_any_cut) {
+TEST(extra_info, items_print_in_order_up_to_a_truncated_one) {
     std::string block;
     std::string text;
     number_base base = number_base::decimal;

@@ -85,7 +85,7 @@ private:
     platform::simulated::installed_machine installed_{*device};
 };
 
-TEST_F(collection, goes_on_after_a_step_without_its_report_or_service) {
+TEST_F(collection, continues_after_a_step_without_its_report_or_service) {
     button.drop_report(0xd7);
     button.drop_report(0xd8);
     expect_collected(diagnostics_text + features_text, report_unsupported + report_unsupported);
@@ -164,7 +164,7 @@ TEST_F(collection, stops_feature_reports_at_the_first_failure) {
 }
 
 // A failure reaches a check of the front end, unless it is that of a close. Missing bytes in a
-// reply are no failure: every banner is printed then.
+// reply are not a failure: every banner is printed then.
 bool is_acceptable(const fault& fault) {
     const bool is_close = fault.name.starts_with("close ");
     const bool by_front_end = fault.result.err.find("failed: keyprobe: ") != std::string::npos;

@@ -109,7 +109,7 @@ TEST(nrxctl_program, is_ended_by_an_interrupt_after_a_watch) {
 }
 
 // Generating four billion lines would take hours.
-TEST(nrxctl_program, goes_on_without_readers_unless_it_only_writes) {
+TEST(nrxctl_program, continues_without_a_reader_unless_it_only_generates) {
     for (const auto target :
          {output_target::closed_pipe, output_target::full_device, output_target::closed}) {
         for (const char* arguments :

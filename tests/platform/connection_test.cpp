@@ -138,7 +138,7 @@ TEST_F(data_queues, wait_for_data_or_the_end_of_the_driver) {
     EXPECT_EQ(dequeue(1, not_found), byte_list{0xee});
 }
 
-TEST_F(data_queues, need_their_mapping_and_a_wait_the_attached_port) {
+TEST_F(data_queues, need_a_mapping_and_a_wait_needs_the_attached_port) {
     connect_streamer().add({1});
     EXPECT_EQ(wait_for_data(queue, allocate_port()), bad_argument);
     EXPECT_EQ(wait_for_data(queue, {}), bad_argument);

@@ -11,7 +11,7 @@ namespace tests {
 
 using platform::simulated::shared_queue;
 
-// The arguments of a method, the capacity for its reply, and the code that it must return.
+// A method call: its arguments, reply capacity and expected return code.
 struct method_call {
     platform::return_code code;
     std::uint32_t selector;

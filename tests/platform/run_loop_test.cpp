@@ -59,7 +59,7 @@ TEST_F(interrupts, are_handled_once_when_a_platform_call_returns) {
     EXPECT_EQ(handled, 1);
 }
 
-TEST_F(interrupts, inside_their_handler_are_handled_afterwards) {
+TEST_F(interrupts, raised_inside_the_handler_are_handled_afterwards) {
     on_handle = [] {
         if (handled > 1) return;
         std::raise(SIGINT);
@@ -71,14 +71,14 @@ TEST_F(interrupts, inside_their_handler_are_handled_afterwards) {
     EXPECT_EQ(handled, 2);
 }
 
-TEST_F(interrupts, pending_are_handled_before_the_default_is_restored) {
+TEST_F(interrupts, if_pending_are_handled_before_the_default_is_restored) {
     std::raise(SIGINT);
     restore_default_interrupt();
     EXPECT_EQ(handled, 1);
     EXPECT_TRUE(has_default_action());
 }
 
-TEST_F(interrupts, pending_prevent_blocking) {
+TEST_F(interrupts, if_pending_prevent_blocking) {
     std::raise(SIGINT);
     simulated::await_interrupt(std::nullopt);
     EXPECT_EQ(handled, 0);
@@ -95,7 +95,7 @@ TEST_F(interrupts, during_a_sleep_are_handled_at_once) {
     EXPECT_EQ(host.clock().now(), 100ms);
 }
 
-TEST_F(interrupts, before_a_wait_are_not_missed) {
+TEST_F(interrupts, raised_before_a_wait_are_not_missed) {
     shared_queue& shared = connect_streamer();
     host.clock().follow_host();
     on_handle = [&] { shared.add({1}); };

@@ -9,7 +9,7 @@ namespace {
 
 using namespace tests;
 
-// Of every number the highest bits are set.
+// The highest bits of every number are set.
 constexpr std::uint64_t high = 0xf000000000000000;
 
 std::vector<std::uint8_t> stats_report(std::size_t size = 282) {

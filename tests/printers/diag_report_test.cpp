@@ -15,7 +15,7 @@ std::string print(std::string_view service, nrx::report_id id, const bytes& repo
     return printed(nrx::print_diag_report, service, id, report).out;
 }
 
-TEST(diag_report, of_morvane_is_the_scan_state_whatever_its_id) {
+TEST(diag_report, morvane_report_of_any_id_prints_the_scan_state) {
     auto report =
         report_with(40, {{0, 4, {0x8000, 0xf0000001, 0xf0000002}},
                          {20, 4, {0xf0000003, 0xf0000004, 0xf0000005, 0xf0000006, 0xf0000007}}});
@@ -87,7 +87,7 @@ TEST(diag_report, of_baseband_is_its_link_counters) {
                        source_file::diag_report);
 }
 
-TEST(diag_report, of_any_other_service_is_a_dump_and_without_bytes_nothing) {
+TEST(diag_report, other_service_is_dumped_and_empty_report_prints_nothing) {
     const rows<const char*, nrx::report_id> dumped{
         {"arc", 0xd0}, {"btmspk", 0xd0}, {"wqr-button", 0xd0}, {"Morvane", 0xd0},
         {"MUX", 0xd0}, {"", 0xd0},       {"mux", 0xd1},        {"baseband", 0xd1},

@@ -3,6 +3,7 @@
 
 #include <csignal>
 
+#include "nrxctl/base/output.h"
 #include "nrxctl/decoders/record_text.h"
 #include "nrxctl/profiler/kernel_profiler.h"
 #include "nrxctl/profiler/scm_monitor.h"
@@ -43,9 +44,9 @@ TEST(monitor_args, duration_and_human_flag_are_parsed_and_printed) {
              {"0x10", 1, "16000 us mode=enable (humanReadable=disabled)\n"},
              {"0", 1, "0 us mode=auto (humanReadable=disabled)\n"},
              {"4294967", 1, "-296 us mode=enable (humanReadable=disabled)\n"}}) {
-        const argument_vector all(split(arguments));
+        const argument_vector command_line(split(arguments));
         int index = 0;
-        nrx::argument_cursor cursor(all.all(), index);
+        nrx::argument_cursor cursor(command_line.span(), index);
         EXPECT_EQ(capture([&] { nrx::parse_monitor_args(cursor); }).out, "duration=" + line);
         EXPECT_EQ(index, count) << line;
     }
@@ -76,15 +77,15 @@ TEST_F(monitor, stream_is_printed_until_the_end_marker) {
 }
 
 TEST_F(monitor, ends_100_ms_after_the_marker_or_a_record_past_the_duration) {
-    const std::string both = dumped(3, 1) + dumped(3, 2);
+    const std::string two_records = dumped(3, 1) + dumped(3, 2);
     using schedule = rows<std::chrono::milliseconds, std::uint8_t>;  // delay, fill; 0: end marker
     for (const auto& [entries, duration, printed, time, remaining] :
          rows<schedule, std::uint32_t, std::string, std::chrono::milliseconds, std::size_t>{
-             {{{0ms, 0}, {0ms, 1}, {0ms, 2}}, 0, both, 100ms, 0},
-             {{{0ms, 1}, {0ms, 0}, {0ms, 2}}, 0, both, 100ms, 0},
-             {{{10ms, 1}, {10ms, 2}, {20ms, 0}}, 0, both, 120ms, 0},
+             {{{0ms, 0}, {0ms, 1}, {0ms, 2}}, 0, two_records, 100ms, 0},
+             {{{0ms, 1}, {0ms, 0}, {0ms, 2}}, 0, two_records, 100ms, 0},
+             {{{10ms, 1}, {10ms, 2}, {20ms, 0}}, 0, two_records, 120ms, 0},
              {{{0ms, 0}, {90ms, 1}, {95ms, 0}, {95ms, 2}}, 0, dumped(3, 1), 100ms, 1},
-             {{{50ms, 1}, {51ms, 2}, {150ms, 0}}, 50'000, both, 151ms, 0}}) {
+             {{{50ms, 1}, {51ms, 2}, {150ms, 0}}, 50'000, two_records, 151ms, 0}}) {
         driver->queue->clear();
         const auto start = host.clock().now();
         for (const auto& [delay, fill] : entries)
@@ -96,6 +97,20 @@ TEST_F(monitor, ends_100_ms_after_the_marker_or_a_record_past_the_duration) {
     EXPECT_TRUE(new_calls().ends_with(
         "profile 1 [0xd2] in [50 c3 00 00]\n"
         "profile 2 [0xd1] capacity 65536\nprofile 2 [0xd1] capacity 65536\n"));
+}
+
+TEST_F(monitor, flushes_output_before_each_wait) {
+    nrx::memory_sink target;
+    const nrx::scoped_sink installed(nrx::standard_stream::output, target);
+    const nrx::block_output blocks;
+    nrx::print_line("buffered");
+    std::vector<std::string> seen;
+    for (const auto moment : {5ms, 50ms})
+        host.clock().run_at(moment, [&] { seen.push_back(target.text()); });
+    add_in(10ms, record_bytes(3, 1));
+    add_in(10ms, end_marker);
+    nrx::monitor_profiler(0, nrx::dump_profile_record);
+    EXPECT_EQ(seen, (std::vector<std::string>{"buffered\n", "buffered\n" + dumped(3, 1)}));
 }
 
 TEST_F(monitor, starts_only_if_the_duration_is_accepted) {
@@ -167,9 +182,9 @@ struct scm_monitor : profiler_test {
     }
 
     static outcome watch(const std::string& duration, const std::string& args = "scm:smb1:ch7") {
-        const argument_vector all(split(args));
+        const argument_vector command_line(split(args));
         int index = 0;
-        return capture([&] { nrx::scm_monitor(duration, all.all(), index); });
+        return capture([&] { nrx::scm_monitor(duration, command_line.span(), index); });
     }
 };
 

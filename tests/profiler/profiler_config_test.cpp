@@ -67,7 +67,7 @@ TEST(profiler_config, prints_as_one_line) {
 // What becomes of arguments, which are separated by spaces.
 struct parsed {
     explicit parsed(const std::string& text) : arguments(split(text)) {
-        nrx::argument_cursor cursor(arguments.all(), arguments_read);
+        nrx::argument_cursor cursor(arguments.span(), arguments_read);
         written = capture([&] { result = nrx::parse_profiler_configs(cursor, configs); });
     }
 

@@ -35,10 +35,10 @@ std::string dumped(std::uint8_t type, std::uint8_t fill) {
 }
 
 byte_list joined(const std::vector<byte_list>& lists) {
-    byte_list all;
+    byte_list bytes;
     for (const byte_list& list : lists)
-        all.insert(all.end(), list.begin(), list.end());
-    return all;
+        bytes.insert(bytes.end(), list.begin(), list.end());
+    return bytes;
 }
 
 bool has_default_interrupt_action() {
@@ -102,9 +102,10 @@ std::string profiler_test::new_calls() {
 }
 
 outcome profiler_test::profile(const std::string& command_line) {
-    const argument_vector all(split(command_line));
+    const argument_vector arguments(split(command_line));
     int index = 1;
-    outcome written = capture([&] { nrx::profile_command(all.all()[0], all.all(), index); });
+    outcome written =
+        capture([&] { nrx::profile_command(arguments.span()[0], arguments.span(), index); });
     arguments_read = index - 1;
     return written;
 }

@@ -74,8 +74,9 @@ protected:
     // Sets the log of the coprocessor: a record that is read once.
     void set_fw_log(const byte_list& record);
 
-    // The log since the last time in short, without look-ups and releases; and the method calls in
-    // it, such as "profile 3 [0x24] in [01 zeros]": scalars in brackets, "zeros" for 36 of them.
+    // The log entries since the last call, abbreviated, without look-ups and releases; and the
+    // method calls in it, such as "profile 3 [0x24] in [01 zeros]": scalars in brackets, "zeros"
+    // for 36 of them.
     std::string new_events();
     std::string new_calls();
 

@@ -22,17 +22,17 @@ namespace {
 using nrx::event_memory::allocate;
 using nrx::event_memory::deallocate;
 
-// A copy in an allocation of its own size: a byte read outside is a sanitizer's find.
+// A copy in an allocation of its own size: a sanitizer detects a read outside.
 using exact_copy = std::vector<char>;
 
 std::string_view view(const exact_copy& bytes) {
     return {bytes.data(), bytes.size()};
 }
 
-using sixteen = std::array<char, nrx::simd16::size>;
+using chunk = std::array<char, nrx::simd16::size>;
 
 template <class Simd>
-void expect_plain_results(const sixteen& a, const sixteen& b) {
+void expect_plain_results(const chunk& a, const chunk& b) {
     std::uint32_t equal = 0;
     std::uint32_t matches = 0;
     for (std::size_t i = 0; i < a.size(); ++i) {
@@ -43,17 +43,17 @@ void expect_plain_results(const sixteen& a, const sixteen& b) {
     EXPECT_EQ(Simd(a.data()).find(b[0], b[7], b[15]), matches);
 }
 
-TEST(simd16, and_its_portable_twin_find_what_a_plain_search_finds) {
+TEST(simd16, both_implementations_match_a_plain_search) {
     std::mt19937 random(1);
     for (int round = 0; round < 2000 && !HasFailure(); ++round) {
         // Few different values, so that there are matches.
         std::string values("\x00\x01\x7f\x80\xfe\xff", 6);
         if (round % 2 == 1) values = {static_cast<char>(random()), static_cast<char>(random())};
-        const auto any = [&] { return values[random() % values.size()]; };
-        sixteen a;
-        sixteen b;
-        std::generate(a.begin(), a.end(), any);
-        std::generate(b.begin(), b.end(), any);
+        const auto random_value = [&] { return values[random() % values.size()]; };
+        chunk a;
+        chunk b;
+        std::generate(a.begin(), a.end(), random_value);
+        std::generate(b.begin(), b.end(), random_value);
         expect_plain_results<nrx::simd16>(a, b);
         expect_plain_results<nrx::portable_simd16>(a, b);
     }
@@ -61,16 +61,16 @@ TEST(simd16, and_its_portable_twin_find_what_a_plain_search_finds) {
 
 std::int64_t read_plainly(std::string_view text) {
     const nrx::number_parts parts = nrx::split_number(text);
-    if (parts.digits.size() > 15) return nrx::not_fast;
+    if (parts.digits.size() > 15) return nrx::not_parsed;
     const auto magnitude = nrx::read_digits(parts.digits, parts.hexadecimal ? 16 : 10);
-    if (!magnitude) return nrx::not_fast;
+    if (!magnitude) return nrx::not_parsed;
     return parts.negative ? -*magnitude : *magnitude;
 }
 
 TEST(fast_number, any_byte_at_any_position_gives_the_plain_result) {
     for (const std::string prefix : {"", "-", "+", "0x", "-0x", "+0x"}) {
         const std::string digits = prefix.ends_with('x') ? "1a2Bc3D4e5F67890" : "1234567890123456";
-        EXPECT_EQ(nrx::read_fast_number(prefix), nrx::not_fast);
+        EXPECT_EQ(nrx::read_fast_number(prefix), nrx::not_parsed);
         for (std::size_t length = 1; length <= 16; ++length) {
             std::string text = prefix + digits.substr(16 - length);
             for (char& byte : text) {
@@ -207,7 +207,7 @@ TEST(line_pattern, only_the_last_learned_line_counts) {
              {"accel,x=1,k=v", "accel,x=1,K=v", false},
              {"accel,x=1,k=v", "accel,x=,k=v", false},
              {"accel,x=1,k=v", "accel,x=1,k=", false},
-             // A comma at the very end is no field.
+             // A trailing comma does not add a field.
              {"accel,y=7,", "accel,y=8", true},
              {"accel,y=7,", "accel,y=8,", false},
              {",", ",", false},

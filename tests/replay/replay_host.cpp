@@ -15,9 +15,9 @@ std::string sample_file(std::string_view text) {
 }
 
 int run_replay(const lines& arguments) {
-    const argument_vector all(arguments);
+    const argument_vector command_line(arguments);
     int index = 1;
-    nrx::replay_command(arguments[0], all.all(), index);
+    nrx::replay_command(arguments[0], command_line.span(), index);
     return index - 1;
 }
 

@@ -126,7 +126,7 @@ TEST(sample_files, warns_of_unknown_tags_and_reads_on) {
     }
 }
 
-TEST(sample_files, a_field_that_is_no_pair_fails_the_whole_file) {
+TEST(sample_files, a_malformed_field_rejects_the_whole_file) {
     for (const std::string field :
          {"k", "k=", "=", "==", "k=v=", "k==v", "k=v=w", "=v=", ",k=v", "k=v,,k=v", "k=v,,", "\r",
           "k=,vvv", "k=vv=v", "k=vvv=", "k=vvvv=", "k=vvvv,,"}) {

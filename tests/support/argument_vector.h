@@ -30,8 +30,8 @@ public:
     argument_vector(const argument_vector&) = delete;
     argument_vector& operator=(const argument_vector&) = delete;
 
-    // All arguments.
-    [[nodiscard]] std::span<char* const> all() const {
+    // The arguments.
+    [[nodiscard]] std::span<char* const> span() const {
         return {pointers_.data(), arguments_.size()};
     }
 

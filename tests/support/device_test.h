@@ -26,7 +26,6 @@ using platform::simulated::machine;
 interface_driver& add_service(machine& host, std::string_view name, std::int32_t id);
 
 // The texts of return codes in failure reports.
-inline constexpr const char* bad_argument_text = "bad argument (0xe00002c2)";
 inline constexpr const char* no_memory_text = "out of memory (0xe00002bd)";
 inline constexpr const char* unsupported_text = "unsupported request (0xe00002c7)";
 inline constexpr const char* not_found_text = "service not found (0xe00002f0)";

@@ -4,6 +4,7 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "platform/virtual/machine.h"
 #include "tests/support/capture.h"
@@ -26,6 +27,18 @@ void sweep_faults(
     const std::function<bool(const fault&)>& acceptable = [](const fault& fault) {
         return !fault.result.err.empty();
     });
+
+// An operation, and what may stand in place of a failure report.
+struct sweep_row {
+    std::function<void()> operation;
+    std::string silent_calls = "^$";  // a failure of these calls need not be reported
+    std::string messages = "^$";      // what may be printed instead
+};
+
+// Does that for each row. A failed call must be reported, unless the row says otherwise, or the
+// call fails with an empty result.
+void sweep_faults(const std::function<std::unique_ptr<platform::simulated::machine>()>& make_host,
+                  const std::vector<sweep_row>& rows);
 
 // What most operations must do about a failed call: report it. Not required if the look-up of a
 // prefixed name fails, which finds nothing in a successful run either, or if a reply is empty.

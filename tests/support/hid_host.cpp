@@ -6,19 +6,20 @@ namespace {
 
 class scripted_events final : public platform::simulated::hid_event_source {
 public:
-    explicit scripted_events(scripted_notifications news) : news_(std::move(news)) {}
+    explicit scripted_events(scripted_notifications notifications)
+        : notifications_(std::move(notifications)) {}
 
     [[nodiscard]] std::optional<clock_time> next_due() const override {
-        return news_.empty() ? std::nullopt : std::optional(news_.front().first);
+        return notifications_.empty() ? std::nullopt : std::optional(notifications_.front().first);
     }
     platform::simulated::hid_notification pop_notification() override {
-        auto first = std::move(news_.front().second);
-        news_.pop_front();
+        auto first = std::move(notifications_.front().second);
+        notifications_.pop_front();
         return first;
     }
 
 private:
-    scripted_notifications news_;
+    scripted_notifications notifications_;
 };
 
 }  // namespace
@@ -44,9 +45,10 @@ scripted_records& add_hid_device(machine& host, std::string_view name, std::int3
     return *records;
 }
 
-void set_hid_events_script(machine& host, scripted_notifications news) {
-    host.set_hid_events(
-        [news = std::move(news)] { return std::make_unique<scripted_events>(news); });
+void set_hid_events_script(machine& host, scripted_notifications notifications) {
+    host.set_hid_events([notifications = std::move(notifications)] {
+        return std::make_unique<scripted_events>(notifications);
+    });
 }
 
 }  // namespace tests

@@ -35,7 +35,7 @@ scripted_records& add_hid_device(machine& host, std::string_view name, std::int3
 using scripted_notifications =
     std::deque<std::pair<clock_time, platform::simulated::hid_notification>>;
 
-// Gives the host an event system that tells each of its clients these news.
-void set_hid_events_script(machine& host, scripted_notifications news);
+// Gives the host an event system that tells each of its clients these notifications.
+void set_hid_events_script(machine& host, scripted_notifications notifications);
 
 }  // namespace tests

@@ -10,7 +10,7 @@ namespace nrx::event_memory {
 void* allocate(std::size_t size);
 void deallocate(void* event) noexcept;
 
-// Asks the system to back the huge pages inside a piece of memory each as a whole, on first use.
+// Asks the system to back the memory with huge pages where it is aligned for them.
 // Mapping 4 KiB pages one by one takes longer than filling them.
 void prefer_huge_pages(void* memory, std::size_t size) noexcept;
 

@@ -69,7 +69,7 @@ std::uint64_t join_digits(std::uint64_t values) {
 template <std::uint64_t Base>
 [[gnu::always_inline]] inline std::int64_t read_word(std::string_view digits) {
     const auto [values, valid] = decode_digits<Base>(load_padded(digits));
-    return valid ? static_cast<std::int64_t>(join_digits<Base>(values)) : not_fast;
+    return valid ? static_cast<std::int64_t>(join_digits<Base>(values)) : not_parsed;
 }
 
 // Reads nine to fifteen digits, which fit signed 64 bits in either base.
@@ -79,17 +79,17 @@ std::int64_t read_two_words(std::string_view digits) {
     const std::size_t high_length = digits.size() - word_length;
     const std::int64_t high = read_word<Base>(digits.substr(0, high_length));
     const std::int64_t low = read_word<Base>(digits.substr(high_length));
-    return high == not_fast || low == not_fast ? not_fast : high * word_base + low;
+    return high == not_parsed || low == not_parsed ? not_parsed : high * word_base + low;
 }
 
 constexpr std::int64_t apply_sign(const number_parts& parts, std::int64_t magnitude) {
-    // not_fast has no negative.
-    return parts.negative && magnitude != not_fast ? -magnitude : magnitude;
+    // not_parsed has no negative.
+    return parts.negative && magnitude != not_parsed ? -magnitude : magnitude;
 }
 
-// Apart from read_fast_number, so that only these calls save registers.
+// Not inlined into read_fast_number, so that only long numbers pay for saving registers.
 [[gnu::noinline]] std::int64_t read_long_number(const number_parts& parts) {
-    if (parts.digits.size() >= 2 * word_length) return not_fast;
+    if (parts.digits.size() >= 2 * word_length) return not_parsed;
     return apply_sign(parts, parts.hexadecimal ? read_two_words<16>(parts.digits)
                                                : read_two_words<10>(parts.digits));
 }
@@ -102,7 +102,7 @@ std::int64_t read_fast_number(std::string_view text) {
         return read_word<16>(text.substr(hex_prefix.size()));
     const number_parts parts = split_number(text);
     if (parts.digits.size() > word_length) return read_long_number(parts);
-    if (parts.digits.empty()) return not_fast;
+    if (parts.digits.empty()) return not_parsed;
     return apply_sign(
         parts, parts.hexadecimal ? read_word<16>(parts.digits) : read_word<10>(parts.digits));
 }

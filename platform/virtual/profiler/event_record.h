@@ -5,33 +5,16 @@
 #include <cstddef>
 #include <cstdint>
 #include <deque>
-#include <span>
 #include <vector>
 
 #include "platform/bytes.h"
 #include "platform/virtual/machine_clock.h"
+#include "platform/virtual/profiler/event_kinds.h"
 
 namespace platform::simulated {
 
 inline constexpr std::size_t event_record_size = 48;
 using event_record = std::array<std::uint8_t, event_record_size>;
-
-// A kind of event: when it is produced, and what its records contain. The bodies vary with the
-// number of the event.
-struct event_kind {
-    // A component number that stands for every component of the category.
-    static constexpr std::uint32_t any_component = 0xffffffff;
-
-    std::uint32_t category;
-    std::uint32_t component;
-    std::uint32_t reports;  // produced if the component's report mask has one of these bits
-    std::uint8_t event;
-    std::uint8_t type;
-    void (*fill)(byte_span record, std::uint64_t number);
-};
-
-// All kinds of events.
-extern const std::span<const event_kind> event_kinds;
 
 // Creates the records of an event: usually one, but a bus transfer is followed by its data. time is
 // the coprocessor's. Each record takes a sequence number and increments it.

@@ -143,7 +143,7 @@ constexpr std::array sensors{
 using word_report = report_bytes<4>;
 using text_report = report_bytes<32>;
 
-constexpr word_report word(std::int64_t value) {
+constexpr word_report u32_report(std::int64_t value) {
     word_report bytes{};
     store_number(bytes, 0, 4, value);
     return bytes;
@@ -195,22 +195,22 @@ struct packed_sensor {
 
 consteval packed_sensor pack(const sensor_row& row) {
     packed_sensor packed{
-        .interval = word(row.interval),
-        .part_interval = word(row.part_interval),
-        .tick_interval = word(row.tick_interval),
-        .filter = word(row.filter ? 1 : 0),
-        .fixed_rate = word(row.fixed_rate ? 1 : 0),
-        .decimation = word(row.part_interval < row.interval ? 1 : 0),
+        .interval = u32_report(row.interval),
+        .part_interval = u32_report(row.part_interval),
+        .tick_interval = u32_report(row.tick_interval),
+        .filter = u32_report(row.filter ? 1 : 0),
+        .fixed_rate = u32_report(row.fixed_rate ? 1 : 0),
+        .decimation = u32_report(row.part_interval < row.interval ? 1 : 0),
         .batched = pack(row.batched),
-        .raw_mode = word(row.mode == sensor_mode::raw ? 1 : 0),
-        .factory_mode = word(row.mode == sensor_mode::factory ? 1 : 0),
+        .raw_mode = u32_report(row.mode == sensor_mode::raw ? 1 : 0),
+        .factory_mode = u32_report(row.mode == sensor_mode::factory ? 1 : 0),
         .vendor = text(row.vendor),
         .model = text(row.model),
         .intervals = {},
         .intervals_length = 0,
-        .startup = word(row.startup),
-        .internal_at_100hz = word(row.internal_at_100hz),
-        .calibrated = word(static_cast<std::int64_t>(row.calibrated)),
+        .startup = u32_report(row.startup),
+        .internal_at_100hz = u32_report(row.internal_at_100hz),
+        .calibrated = u32_report(static_cast<std::int64_t>(row.calibrated)),
         .location = location(row.place, row.alternate),
     };
     for (const std::int64_t interval : row.intervals) {
@@ -311,11 +311,11 @@ consteval report_bytes<4 * Count> list(const std::int64_t (&values)[Count]) {
 }
 
 // Ranges in g and degrees per second; bandwidths in Hz, 0 means automatic.
-constexpr auto accel_range = word(8);
+constexpr auto accel_range = u32_report(8);
 constexpr auto accel_ranges = list({2, 4, 8, 16, 32});
-constexpr auto accel_bandwidth = word(50);
+constexpr auto accel_bandwidth = u32_report(50);
 constexpr auto accel_bandwidths = list({0, 25, 50, 100, 200});
-constexpr auto gyro_range = word(2'000);
+constexpr auto gyro_range = u32_report(2'000);
 constexpr auto gyro_ranges = list({250, 500, 1'000, 2'000});
 
 constexpr std::array motion_reports{

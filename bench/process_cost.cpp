@@ -1,4 +1,4 @@
-#include "bench/process_times.h"
+#include "bench/process_cost.h"
 
 #include <chrono>
 #include <cstdio>
@@ -41,7 +41,7 @@ private:
 
 }  // namespace
 
-process_cost run_once(const std::vector<std::string>& arguments) {
+process_cost measure_process(const std::vector<std::string>& arguments) {
     static const null_streams streams;
     std::vector<char*> pointers;
     pointers.reserve(arguments.size() + 1);

@@ -13,7 +13,8 @@ struct process_cost {
 };
 
 // Runs a program, looked up in PATH, with its standard streams open on /dev/null. If the program
-// cannot be started or a signal kills it, prints a message and ends this process with status 1.
-process_cost run_once(const std::vector<std::string>& arguments);
+// cannot be started, is killed by a signal, or exits with status 126 or more, prints a message and
+// ends this process with status 1.
+process_cost measure_process(const std::vector<std::string>& arguments);
 
 }  // namespace bench

@@ -44,11 +44,11 @@ void check_argument(std::string_view argument, const parse_result& result) {
     fuzz::require(nrx::encode_configs(nrx::decode_configs(bytes)) == bytes);
 }
 
-// All arguments together give the records of each, up to the first that is invalid.
-void check_arguments(const fuzz::argument_list& line) {
+// Parsing all arguments together must give the records of each, up to the first invalid one.
+void check_arguments(const fuzz::argument_list& list) {
     config_list expected;
     bool all_valid = true;
-    for (const std::string_view argument : line.arguments()) {
+    for (const std::string_view argument : list.arguments()) {
         if (!all_valid) break;
         const parse_result result = parse(argument);
         check_argument(argument, result);
@@ -56,14 +56,14 @@ void check_arguments(const fuzz::argument_list& line) {
         all_valid = result.completed && result.valid;
     }
     int index = 0;
-    nrx::argument_cursor arguments(line.arguments(), index);
+    nrx::argument_cursor arguments(list.arguments(), index);
     config_list configs;
     bool valid = false;
     const bool completed =
         fuzz::completes([&] { valid = nrx::parse_profiler_configs(arguments, configs); });
     fuzz::require((completed && valid) == all_valid);
     fuzz::require(nrx::encode_configs(configs) == nrx::encode_configs(expected));
-    fuzz::require(index <= line.count());
+    fuzz::require(index <= list.count());
 }
 
 }  // namespace

@@ -17,9 +17,9 @@ namespace {
 
 constexpr std::uint32_t max_samples = 64;
 
-std::optional<nrx::signal_request> read(const fuzz::argument_list& line) {
+std::optional<nrx::signal_request> read_request(const fuzz::argument_list& list) {
     int index = 0;
-    nrx::argument_cursor arguments(line.arguments(), index);
+    nrx::argument_cursor arguments(list.arguments(), index);
     std::optional<nrx::signal_request> request;
     fuzz::completes([&] { request = nrx::read_signal_request(arguments); });
     fuzz::require(!request || index == 4);
@@ -41,8 +41,8 @@ void check_line(const std::string& line, const nrx::signal_request& request, std
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    const fuzz::argument_list line = fuzz::split_arguments(fuzz::as_text(data, size));
-    auto request = read(line);
+    const fuzz::argument_list list = fuzz::split_arguments(fuzz::as_text(data, size));
+    auto request = read_request(list);
     if (!request) return 0;
     request->samples = std::min(request->samples, max_samples);
     nrx::generate_samples(*request);

@@ -1,0 +1,69 @@
+#include <chrono>
+#include <cstdint>
+#include <limits>
+#include <optional>
+
+#include "nrxctl/nrxtoollib.h"
+#include "nrxctl/options/option_functions.h"
+#include "platform/clock.h"
+#include "platform/interrupt.h"
+#include "platform/run_loop.h"
+
+namespace nrx::nrxctl {
+
+namespace {
+
+// While it exists, an interrupt stops the event loop. Its destructor restores the default action,
+// which ends the process. An interrupt that comes after the loop has ended but before that is not
+// lost: the next option that runs the loop ends at once.
+class loop_interrupt_handler {
+public:
+    loop_interrupt_handler() { platform::set_interrupt_handler(platform::stop_loop); }
+    ~loop_interrupt_handler() { platform::restore_default_interrupt(); }
+    loop_interrupt_handler(const loop_interrupt_handler&) = delete;
+    loop_interrupt_handler& operator=(const loop_interrupt_handler&) = delete;
+};
+
+// Sets the references with which the times of HID events are computed.
+void set_clock_references() {
+    constexpr double microseconds = 1e6;
+    const platform::clock_reading now = platform::read_clocks();
+    monotonic_reference = tick_period * static_cast<double>(now.ticks);
+    wall_reference = static_cast<double>(now.wall.seconds) +
+                     static_cast<double>(now.wall.microseconds) / microseconds;
+}
+
+}  // namespace
+
+option_result watch_events(option_arguments& arguments) {
+    std::optional<std::chrono::seconds> duration;
+    if (const auto argument = arguments.next()) {
+        constexpr auto max_seconds = std::numeric_limits<std::int32_t>::max();
+        duration =
+            std::chrono::seconds(parse_number_up_to(max_seconds, *argument, "seconds are invalid"));
+    }
+    set_clock_references();
+    const loop_interrupt_handler handler;
+    return result_of(watch_hid_events(duration));
+}
+
+// Switches the mode off after the watch even if the watch failed or was interrupted.
+option_result watch_spi(option_arguments& arguments) {
+    const auto mode_argument = arguments.next();
+    if (!mode_argument) return option_result::usage_error;
+    constexpr auto max_mode = std::numeric_limits<std::uint32_t>::max();
+    const std::uint32_t mode = parse_number_up_to(max_mode, *mode_argument, "mode is invalid");
+    service_id id{};
+    if (!resolve_service_id(arguments.required(), id)) {
+        text_line message;
+        message.text("service is invalid (").text(arguments.required()).text(")");
+        print_line(message.view());
+        return option_result::failed;
+    }
+    const loop_interrupt_handler handler;
+    const platform::return_code result = watch_spi_status(id, mode);
+    if (mode != 0) watch_spi_status(id, 0);
+    return result_of(result);
+}
+
+}  // namespace nrx::nrxctl
