@@ -67,15 +67,18 @@ TEST(input_error_stats, prints_every_counter_under_the_name_of_the_service) {
 
 TEST(transfer_errors, prints_a_line_for_each_complete_record) {
     const auto record = [](std::string_view name) {
-        bytes all = report_with(32, {{0, 4, {0xf0000000, 1, 200, 0xf0000003, 0x80000000, 3}}}, 0);
-        std::copy(name.begin(), name.end(), all.begin() + 24);
-        return all;
+        bytes report = report_with(
+            32, {{0, 4, {0xf0000000, 0xf0000001, 0xf0000002, 0xf0000003, 0x80000000, 0xf0000005}}},
+            0);
+        std::copy(name.begin(), name.end(), report.begin() + 24);
+        return report;
     };
     auto report = record("spi0");
     const auto second = record("i2cm0xyz");
     report.insert(report.end(), second.begin(), second.end());
     const std::string counters =
-        " read_errors: 1/-268435456 write_errors: -268435453/200 other_errors: 3/-2147483648\n";
+        " read_errors: -268435455/-268435456 write_errors: -268435453/-268435454 "
+        "other_errors: -268435451/-2147483648\n";
     const auto print_first = [&](std::ptrdiff_t size) {
         return print(nrx::print_transfer_errors, "x", {report.begin(), report.begin() + size});
     };
