@@ -21,15 +21,15 @@ struct comparison {
     std::string label;
     std::string ratio_budget;
     std::string megabytes_budget;
-    std::vector<std::string> ours;
+    std::vector<std::string> subject;
     std::vector<std::string> peer;
 };
 
 struct measurements {
-    std::vector<double> ours;
+    std::vector<double> subject;
     std::vector<double> peer;
     std::vector<double> ratios;  // of each pair
-    double megabytes = 0;        // peak memory of ours
+    double megabytes = 0;        // peak memory of the subject
 };
 
 std::optional<comparison> parse_arguments(std::span<char*> arguments) {
@@ -42,7 +42,7 @@ std::optional<comparison> parse_arguments(std::span<char*> arguments) {
                       .label = arguments[1],
                       .ratio_budget = arguments[2],
                       .megabytes_budget = arguments[3],
-                      .ours = {commands.begin(), separator},
+                      .subject = {commands.begin(), separator},
                       .peer = {separator + 1, commands.end()}};
 }
 
@@ -59,23 +59,23 @@ double median(const std::vector<double>& values) {
 measurements run(const comparison& comparison) {
     measurements results;
     // Warms the page cache with everything that the two read.
-    bench::measure_process(comparison.ours);
+    bench::measure_process(comparison.subject);
     bench::measure_process(comparison.peer);
     for (int i = 0; i < comparison.pairs; ++i) {
-        const auto ours = bench::measure_process(comparison.ours);
+        const auto subject = bench::measure_process(comparison.subject);
         const auto peer = bench::measure_process(comparison.peer);
-        results.ours.push_back(ours.microseconds);
+        results.subject.push_back(subject.microseconds);
         results.peer.push_back(peer.microseconds);
-        results.ratios.push_back(ours.microseconds / peer.microseconds);
-        results.megabytes = std::max(results.megabytes, ours.megabytes);
+        results.ratios.push_back(subject.microseconds / peer.microseconds);
+        results.megabytes = std::max(results.megabytes, subject.megabytes);
     }
     return results;
 }
 
 // Returns the budget, marked if the measured value exceeds it.
 std::string format_budget(double measured, const std::string& budget) {
-    const bool over = budget != "-" && measured > std::atof(budget.c_str());
-    return over ? budget + " over" : budget;
+    const bool is_exceeded = budget != "-" && measured > std::atof(budget.c_str());
+    return is_exceeded ? budget + " over" : budget;
 }
 
 void print_header() {
@@ -84,9 +84,9 @@ void print_header() {
 }
 
 void print_row(const comparison& comparison, const measurements& results) {
-    const double ratio = median(results.ours) / median(results.peer);
+    const double ratio = median(results.subject) / median(results.peer);
     std::printf("%-42s %10.0f %10.0f %7.3f %7.3f - %-7.3f %-11s %6.2f %s\n",
-                comparison.label.c_str(), median(results.ours), median(results.peer), ratio,
+                comparison.label.c_str(), median(results.subject), median(results.peer), ratio,
                 quantile(results.ratios, 0.25), quantile(results.ratios, 0.75),
                 format_budget(ratio, comparison.ratio_budget).c_str(), results.megabytes,
                 format_budget(results.megabytes, comparison.megabytes_budget).c_str());

@@ -102,7 +102,7 @@ private:
         for (std::size_t offset = 16; offset < 40; offset += 4)
             set_field(record, offset, skewed_number(), 4);
         switch (type) {
-            case 1: {
+            case 1: {  // long data
                 const std::uint64_t length = 4 + random_below(21);
                 set_field(record, 16, random_below(8), 2);
                 set_field(record, 18, 24 + random_below(200), 2);
@@ -111,21 +111,21 @@ private:
                 set_random_bytes(record, 24, length);
                 break;
             }
-            case 2:
+            case 2:  // short data
                 set_field(record, 16, random_below(8), 2);
                 set_random_bytes(record, 18, 30);
                 break;
-            case 8:
+            case 8:  // sensor info
                 set_field(record, 32, 0x000201, 3);
                 set_text(record, 35, 12);
                 break;
-            case 9:
+            case 9:  // external function
                 set_text(record, 32, 16);
                 break;
-            case 11:
+            case 11:  // annotation
                 set_text(record, 24, 8);
                 break;
-            case 12:
+            case 12:  // decimation
                 set_text(record, 36, 12);
                 break;
             default:

@@ -34,7 +34,7 @@ void check_line(const std::string& line, const nrx::signal_request& request, std
     fuzz::require(nrx::load_le<std::uint32_t>(event->data() + 8) == number);
     const auto value = nrx::load_le<std::int32_t>(event->data() + 16);
     fuzz::require(value >= -0x10000 && value <= 0x10000);
-    // An event keeps 32 bits of its time stamp.
+    // An event keeps 32 bits of its timestamp.
     fuzz::require(static_cast<std::uint32_t>(event->timestamp()) == number * request.interval);
 }
 

@@ -43,7 +43,7 @@ std::optional<nrx::sample_groups> read(const std::string& path) {
     return groups;
 }
 
-// Starting from the base time, the deltas must add up to the time stamps.
+// Starting from the base time, the deltas must add up to the timestamps.
 void check_list(const std::string& name, const nrx::event_list& events, std::uint64_t base) {
     fuzz::require(!events.empty());
     std::uint64_t previous = base;

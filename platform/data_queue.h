@@ -21,7 +21,7 @@ bool data_available(const mapped_memory& queue);
 // leaves the span as it was.
 return_code dequeue(const mapped_memory& queue, byte_span& entry);
 
-// Blocks until the queue holds data, without a time-out and without using the processor. Returns at
+// Blocks until the queue holds data, without a timeout and without using the processor. Returns at
 // once if there is data already. The port must be attached to the queue's driver. Interrupt
 // handlers run during the wait. Fails with bad_argument if the queue is not mapped or is not
 // signalled on this port, with not_found if the driver is gone or goes away, and with the host's

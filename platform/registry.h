@@ -1,4 +1,4 @@
-// The host's driver registry: look-up, entry names, properties.
+// The host's driver registry: lookup, entry names, properties.
 #pragma once
 
 #include <optional>

@@ -1,4 +1,4 @@
-// The event loop of the calling thread. Scheduled objects call back while it runs.
+// The event loop (run loop) of the calling thread. Scheduled objects call back while it runs.
 #pragma once
 
 #include <chrono>

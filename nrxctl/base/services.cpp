@@ -14,7 +14,7 @@ namespace nrx {
 
 namespace {
 
-// The condition of a look-up, in failure reports.
+// The condition of a lookup, in failure reports.
 constexpr const char* service_is_not_null = "service != ((io_object_t) 0)";
 
 bool is_numeric(std::string_view service_name) {

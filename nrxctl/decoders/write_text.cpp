@@ -12,7 +12,7 @@ namespace nrx {
 
 namespace {
 
-// Eight characters in a number, the first in the lowest byte, so that they are made, shortened and
+// Eight characters in a number, the first in the lowest byte. They are computed, shortened and
 // stored without a loop or a branch.
 using eight_characters = std::uint64_t;
 

@@ -101,8 +101,8 @@ std::vector<std::uint8_t> make_request(replay_load_header header, const event_li
         byte_count += event->size();
     header.byte_count = static_cast<std::uint32_t>(byte_count);
     std::vector<std::uint8_t> request;
-    append_words(request, {static_cast<std::uint32_t>(header.service_id), header.completion,
-                           header.location, header.filter, header.byte_count});
+    append_words(request, {wire_word(header.service_id), header.completion, header.location,
+                           header.filter, header.byte_count});
     request.reserve(request.size() + byte_count);
     for (const event_ptr& event : events)
         request.insert(request.end(), event->data(), event->data() + event->size());
@@ -148,7 +148,7 @@ void unload_service(const service_conn& conn, std::string_view service) {
         return;
     }
     std::vector<std::uint8_t> request;
-    append_words(request, {static_cast<std::uint32_t>(id)});
+    append_words(request, {wire_word(id)});
     if (call_app(conn, unload_method, request) != platform::success)
         print_service_message(service, " can't be unloaded");
 }

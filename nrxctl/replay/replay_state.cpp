@@ -44,7 +44,7 @@ void set_replay_state(std::span<const std::string_view> services, std::uint32_t 
         service_id id = 0;
         const bool success = resolve_service_id(service, id);
         if (!check(success, condition::success)) return;
-        append_words(report, {static_cast<std::uint32_t>(id), delay, state});
+        append_words(report, {wire_word(id), delay, state});
     }
     const auto kr = set_report(replay_app_name, state_report, report);
     check_success(kr, condition::kr_is_zero);
@@ -74,7 +74,7 @@ void print_entry(const replay_state_entry& entry) {
     constexpr std::size_t name_width = 10;
     std::string name;
     if (!service_name_for_id(entry.service_id, name))
-        name = std::to_string(static_cast<std::uint32_t>(entry.service_id));
+        name = std::to_string(wire_word(entry.service_id));
     text_line line;
     line.text("Service ").pad_right(name, name_width).text(" is ");
     if (const std::string_view* state_name = state_names.find(entry.state)) {

@@ -13,7 +13,7 @@ namespace nrx {
 
 namespace {
 
-// An event with a copy of its time stamp, so that sorting touches no event.
+// An event with a copy of its timestamp, so that sorting touches no event.
 struct timestamped_event {
     std::uint64_t timestamp;
     event_ptr event;

@@ -16,8 +16,8 @@ using event_list = std::vector<event_ptr>;
 // The samples of a file by service name, in byte-wise order. No list is empty.
 using sample_groups = std::map<std::string, event_list, std::less<>>;
 
-// Reads the samples of a file in the order of their upload: each service's by time stamp, compared
-// as unsigned numbers; samples with the same time stamp keep their order. Sets the deltas: the time
+// Reads the samples of a file in the order of their upload: each service's by timestamp, compared
+// as unsigned numbers; samples with the same timestamp keep their order. Sets the deltas: the time
 // since the sample before it, and for the first of a service the time since the earliest of all.
 //
 // A line is a tag and fields KEY=VALUE, separated by commas. Empty lines, comments and tags with a

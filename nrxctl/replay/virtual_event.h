@@ -13,7 +13,7 @@
 
 namespace nrx {
 
-// Holds the record of a sample as it is uploaded, and its time stamp. A record consists of
+// Holds the record of a sample as it is uploaded, and its timestamp. A record consists of
 // little-endian 32-bit words: its size in bytes, the delta in microseconds to the record before it,
 // the sample id, the temperature in degrees with 16 fraction bits, and the sample's signed values.
 class VirtualEvent {
@@ -57,7 +57,7 @@ public:
 
 using event_ptr = std::unique_ptr<VirtualEvent>;
 
-// The record and time stamp of an event with the given number of values.
+// The record and timestamp of an event with the given number of values.
 template <std::size_t ValueCount>
 class recorded_event : public VirtualEvent {
 public:
@@ -69,7 +69,7 @@ public:
 protected:
     using value_keys = std::array<sample_key, ValueCount>;
 
-    // Fills the record and the time stamp; the keys are those of the values, in their order.
+    // Fills the record and the timestamp; the keys are those of the values, in their order.
     void parse_record(const sample_values& values, const value_keys& keys);
 
 private:

@@ -88,7 +88,7 @@ const std::vector<entry_ref>& candidates_for(const machine& host, const dictiona
 
 }  // namespace
 
-// --- look-up ---
+// --- lookup ---
 
 void service_kind::release(handle_id id) {
     machine& host = current_machine();

@@ -37,9 +37,9 @@ void machine::remove(std::string_view name) {
 }
 
 const std::vector<entry_ref>& machine::entries_of_class(std::string_view name) const {
-    static const std::vector<entry_ref> none;
+    static const std::vector<entry_ref> no_entries;
     const auto match = by_class_.find(name);
-    return match == by_class_.end() ? none : match->second;
+    return match == by_class_.end() ? no_entries : match->second;
 }
 
 void machine::release_object(handle_id id) {

@@ -54,7 +54,7 @@ public:
     // The first present entry with a registry name; null if there is none.
     [[nodiscard]] entry_ref find(std::string_view name) const;
 
-    // Removes a service and everything attached to it, as when its driver terminates. Look-ups no
+    // Removes a service and everything attached to it, as when its driver terminates. Lookups no
     // longer return it, and calls on objects that are open on it fail with not_found.
     void remove(std::string_view name);
 

@@ -16,7 +16,7 @@ public:
     // Time since the clock started.
     using time = std::chrono::nanoseconds;
 
-    // Switches to the clock of the underlying host for good.
+    // Switches permanently to the clock of the underlying host.
     void follow_host() { follows_host_ = true; }
 
     [[nodiscard]] time now() const;
@@ -29,7 +29,7 @@ public:
 
     // Waits until the deadline, or without limit. The wait ends early at the next timed action,
     // which is run, and at the next interrupt, which is left pending. Returns false if nothing can
-    // end the wait; only the manual clock can tell.
+    // end the wait, which only the manual clock knows.
     bool advance(std::optional<time> deadline);
 
     // Runs an action when the manual clock reaches the given time.

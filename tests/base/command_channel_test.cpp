@@ -6,6 +6,7 @@
 #include <new>
 
 #include "tests/base/base_host.h"
+#include "tests/support/argument_vector.h"
 
 namespace {
 
@@ -33,8 +34,6 @@ namespace tests {
 namespace {
 
 using platform::return_code;
-using lines = std::vector<std::string>;
-
 constexpr const char* calls_file = source_file::command_channel;
 const std::string unsupported_call = library_report(calls_file, "kr == 0 ", unsupported_text);
 

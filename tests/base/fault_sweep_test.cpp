@@ -61,7 +61,7 @@ TEST(base_fault_sweep, every_failed_call_of_discovery_is_reported) {
     std::string name;
     nrx::service_id id = 0;
     const platform::property value(5);
-    // The look-up without a prefix that finds nothing is reported; nothing else is.
+    // The lookup without a prefix that finds nothing is reported; nothing else is.
     const auto missing_interface = [](const fault& fault) {
         const bool is_last_lookup = fault.name.find("IONameMatch = \"accel\"") != std::string::npos;
         return fault.result.err.empty() != is_last_lookup;

@@ -1,12 +1,11 @@
 #include "nrxctl/base/mca.h"
 
 #include "tests/base/base_host.h"
+#include "tests/support/argument_vector.h"
 
 namespace tests {
 
 namespace {
-
-using lines = std::vector<std::string>;
 
 // Switches the MCA and checks the heading. Returns the failure reports.
 std::string switch_mca(bool on, platform::return_code expected) {
@@ -61,7 +60,7 @@ TEST_F(mca, first_failed_step_ends_the_sequence_and_is_reported_reports) {
         EXPECT_EQ(switch_mca(on, platform::success), "");
         EXPECT_EQ(calls(), steps);
         for (std::size_t step = 1; step <= steps.size(); ++step) {
-            // Each step makes four platform calls: two look-ups, an open, a call.
+            // Each step makes four platform calls: two lookups, an open, a call.
             host.fail_call(4 * step, failure::io);
             EXPECT_EQ(switch_mca(on, platform::simulated::io_failure), reports) << step;
             EXPECT_EQ(calls().size(), step);

@@ -11,6 +11,7 @@
 
 #include "nrxctl/base/services.h"
 #include "nrxctl/base/utf8.h"
+#include "tests/support/argument_vector.h"
 #include "tests/support/device_test.h"
 #include "tests/support/rows.h"
 
@@ -29,8 +30,6 @@ public:
     std::vector<std::string> writes;
     bool failing = false;
 };
-
-using strings = std::vector<std::string>;
 
 TEST(descriptor_sink, whole_text_passes_a_small_nonblocking_pipe) {
     std::array<int, 2> ends{};
@@ -120,7 +119,7 @@ TEST(block_sink, failure_is_reported_from_the_lost_block_on) {
     EXPECT_FALSE(sink.write("kept\n"));
     EXPECT_FALSE(sink.flush());
     EXPECT_TRUE(sink.failed());
-    EXPECT_EQ(target.writes, strings{"kept\n"});
+    EXPECT_EQ(target.writes, lines{"kept\n"});
 }
 
 TEST(scoped_sink, redirects_one_stream_until_it_is_destroyed) {
@@ -138,9 +137,9 @@ TEST(scoped_sink, redirects_one_stream_until_it_is_destroyed) {
     nrx::write_error("error\n");
     out.failing = true;
     EXPECT_FALSE(nrx::write_output("lost\n"));
-    EXPECT_EQ(inner.writes, strings{"one\n"});
-    EXPECT_EQ(out.writes, (strings{"two\n", "three\nfour\n"}));
-    EXPECT_EQ(err.writes, strings{"error\n"});
+    EXPECT_EQ(inner.writes, lines{"one\n"});
+    EXPECT_EQ(out.writes, (lines{"two\n", "three\nfour\n"}));
+    EXPECT_EQ(err.writes, lines{"error\n"});
 }
 
 TEST(block_output, is_written_before_errors_and_waits) {
@@ -158,7 +157,7 @@ TEST(block_output, is_written_before_errors_and_waits) {
         nrx::print_line("four");
     }
     nrx::print_line("five");
-    EXPECT_EQ(sink.writes, (strings{"one\ntwo\n", "error\n", "three\n", "four\n", "five\n"}));
+    EXPECT_EQ(sink.writes, (lines{"one\ntwo\n", "error\n", "three\n", "four\n", "five\n"}));
 }
 
 // Redirects a standard stream to a new pseudo-terminal.

@@ -23,7 +23,7 @@ std::unique_ptr<machine> make_host() {
 }
 
 TEST(inspection_fault_sweep, failed_call_is_reported_or_optional) {
-    // Reports are optional, and a service may be found by another look-up.
+    // Reports are optional, and a service may be found by another lookup.
     const std::string sensor_calls = "^(first match|call|property of) ";
     sweep_faults(make_host, {{[] { nrx::print_sensor_info("accel", 1); }, sensor_calls},
                              {[] { nrx::print_sensor_info("accel", 2); }, sensor_calls},

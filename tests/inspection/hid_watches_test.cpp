@@ -14,6 +14,7 @@
 #include "platform/clock.h"
 #include "platform/run_loop.h"
 #include "tests/golden/golden_text.h"
+#include "tests/support/argument_vector.h"
 #include "tests/support/hid_host.h"
 #include "tests/support/report_bytes.h"
 #include "tests/support/rows.h"
@@ -22,8 +23,6 @@ namespace tests {
 
 using namespace std::chrono_literals;
 using platform::hid_event;
-using lines = std::vector<std::string>;
-
 const std::array initial_times{nrx::first_event_time, nrx::last_event_time, nrx::last_wall_time};
 
 // A tick is a microsecond, no event has been printed, and the number format is the default.

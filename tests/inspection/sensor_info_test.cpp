@@ -175,7 +175,7 @@ TEST_F(event_statistics, missing_count_is_minus_1_and_time_0) {
 
 using hid_services = device_test;
 
-// Expects the list of names, then the service that each look-up finds. The addresses differ from
+// Expects the list of names, then the service that each lookup finds. The addresses differ from
 // run to run.
 void expect_list(const std::string& name, const std::string& list, int prefixed, int bare,
                  const std::string& err = "") {
@@ -195,7 +195,7 @@ TEST_F(hid_services, look_ups_show_the_service_that_each_finds) {
     expect_list("accel", label, 2, 3);
     host.remove("WQR_accel");
     expect_list("accel", label, 0, 4);
-    // The look-ups are by name alone, and find no HID interfaces.
+    // The lookups are by name alone, and find no HID interfaces.
     expect_list("2", label, 0, 0);
     add_hid_interfaces(host, {"gyro", "WQR_gyro"});
     expect_list("gyro", label + "gyro WQR_gyro ", 0, 0);

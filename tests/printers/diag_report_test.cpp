@@ -41,7 +41,7 @@ TEST(diag_report, morvane_report_of_any_id_prints_the_scan_state) {
               std::string::npos);
 }
 
-TEST(diag_report, the_threshold_of_morvane_is_signed_and_in_single_precision) {
+TEST(diag_report, morvane_threshold_is_signed_and_single_precision) {
     const rows<std::uint64_t, std::string> thresholds{
         {0xffff0000, "-1"}, {0x7fffffff, "32768"}, {0x0000028f, "0.00999451"}};
     for (const auto& [word, text] : thresholds) {
@@ -50,7 +50,7 @@ TEST(diag_report, the_threshold_of_morvane_is_signed_and_in_single_precision) {
     }
 }
 
-TEST(diag_report, of_mux_is_a_line_for_each_complete_record) {
+TEST(diag_report, mux_report_prints_a_line_for_each_complete_record) {
     const auto report =
         report_with(30, {{0, 8, 1}, {8, 4, 5}, {12, 8, 0xffffffffffffffff}, {20, 4, 0xf0abcdef}});
     EXPECT_EQ(print("mux", 0xd0, report),
@@ -60,7 +60,7 @@ TEST(diag_report, of_mux_is_a_line_for_each_complete_record) {
     EXPECT_EQ(print("mux", 0xd0, bytes(12)), "data: 0 timestamp:0\n");
 }
 
-TEST(diag_report, of_baseband_is_its_link_counters) {
+TEST(diag_report, baseband_report_prints_its_link_counters) {
     const auto report =
         report_with(64, {{0, 4, 0xf0000001},
                          {4, 8, 0xf000000000000002},

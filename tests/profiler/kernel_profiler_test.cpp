@@ -17,7 +17,7 @@ TEST_F(profiler_operations, connection_reports_what_is_not_ignored) {
     const std::string unsupported = kr_report(file::kernel_profiler, unsupported_text);
     for (const on_failure mode : {on_failure::report, on_failure::ignore}) {
         const bool ignored = mode == on_failure::ignore;  // a failed mapping is
-        // The call that fails: look-up, open, mapping, port and its attachment.
+        // The call that fails: lookup, open, mapping, port and its attachment.
         for (const auto& [call, kind, reports] : rows<std::size_t, failure, std::string>{
                  {1, failure::empty_result, report("service") + unopened},
                  {2, failure::empty_result, report("connect") + unopened},

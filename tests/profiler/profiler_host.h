@@ -74,7 +74,7 @@ protected:
     // Sets the log of the coprocessor: a record that is read once.
     void set_fw_log(const byte_list& record);
 
-    // The log entries since the last call, abbreviated, without look-ups and releases; and the
+    // The log entries since the last call, abbreviated, without lookups and releases; and the
     // method calls in it, such as "profile 3 [0x24] in [01 zeros]": scalars in brackets, "zeros"
     // for 36 of them.
     std::string new_events();

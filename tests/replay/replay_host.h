@@ -11,8 +11,6 @@
 
 namespace tests {
 
-using lines = std::vector<std::string>;
-
 // Writes a file of samples in memory and returns its path. The next call overwrites the file.
 std::string sample_file(std::string_view text);
 

@@ -274,7 +274,7 @@ TEST_F(replay_subcommands, load_rejects_a_file_if_a_service_has_no_id_or_state) 
     add_service(host, "compass", 0x77);
     expect_load(three_services, "", load_failed);
     EXPECT_EQ(calls(), lines(9, read_state));
-    // Four platform calls find out that replay is enabled: two look-ups, open and call.
+    // Four platform calls find out that replay is enabled: two lookups, open and call.
     host.before_call(5, [&] { host.remove("NRXApp"); });
     expect_load(three_services, "", library_report(source_file::channel, "service") + load_failed);
 }
@@ -295,7 +295,7 @@ TEST_F(replay_subcommands, load_rejects_a_file_if_a_service_has_samples) {
 
 TEST_F(replay_subcommands, load_reports_a_failed_upload_and_keeps_earlier_ones) {
     // The first status takes four platform calls, each of the three checks seven, and an upload
-    // seven: two look-ups of the id, its reading, NRXApp, its child, open, call.
+    // seven: two lookups of the id, its reading, NRXApp, its child, open, call.
     constexpr std::size_t accel_uploaded = 4 + 3 * 7 + 7;
     const auto expect_failure = [&](const std::string& reports) {
         expect_load(three_services, "accel: loaded 1 events\n", reports);

@@ -9,6 +9,8 @@
 
 namespace tests {
 
+using lines = std::vector<std::string>;
+
 // Splits a text at each separator. A separator at the end adds no empty piece.
 inline std::vector<std::string> split(const std::string& text, char separator = ' ') {
     std::vector<std::string> pieces;

@@ -31,15 +31,15 @@ public:
     redirected_descriptor& operator=(const redirected_descriptor&) = delete;
 
     [[nodiscard]] std::string text() const {
-        std::string all;
+        std::string text;
         std::array<char, 4096> buffer;
         off_t offset = 0;
         ssize_t count = 0;
         while ((count = ::pread(memory_, buffer.data(), buffer.size(), offset)) > 0) {
-            all.append(buffer.data(), static_cast<std::size_t>(count));
+            text.append(buffer.data(), static_cast<std::size_t>(count));
             offset += count;
         }
-        return all;
+        return text;
     }
 
 private:

@@ -40,7 +40,7 @@ struct sweep_row {
 void sweep_faults(const std::function<std::unique_ptr<platform::simulated::machine>()>& make_host,
                   const std::vector<sweep_row>& rows);
 
-// What most operations must do about a failed call: report it. Not required if the look-up of a
+// What most operations must do about a failed call: report it. Not required if the lookup of a
 // prefixed name fails, which finds nothing in a successful run either, or if a reply is empty.
 bool is_reported(const fault& fault);
 

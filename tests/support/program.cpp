@@ -36,10 +36,10 @@ std::vector<std::string> read_pieces(int descriptor) {
 }
 
 std::string joined(const std::vector<std::string>& pieces) {
-    std::string all;
+    std::string text;
     for (const std::string& piece : pieces)
-        all += piece;
-    return all;
+        text += piece;
+    return text;
 }
 
 int wait_for(pid_t child) {
@@ -72,7 +72,7 @@ pid_t start_program(const std::string& path, const std::vector<std::string>& arg
                     int err) {
     std::vector<std::string> command{path};
     command.insert(command.end(), arguments.begin(), arguments.end());
-    argument_vector all(std::move(command));
+    argument_vector command_line(std::move(command));
     const pid_t child = ::fork();
     if (child != 0) return child;
     if (out >= 0) {
@@ -81,7 +81,7 @@ pid_t start_program(const std::string& path, const std::vector<std::string>& arg
         ::close(STDOUT_FILENO);
     }
     ::dup2(err, STDERR_FILENO);
-    ::execv(path.c_str(), all.argv());
+    ::execv(path.c_str(), command_line.argv());
     ::_exit(127);
 }
 

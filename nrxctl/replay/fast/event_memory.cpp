@@ -21,7 +21,7 @@ struct block {
     std::size_t events = 0;
 };
 
-// The block that the next event is cut from. It is kept when it is empty.
+// The block in which the next event is allocated. It is kept even if it becomes empty.
 block* current = nullptr;
 
 block* block_of(void* event) {

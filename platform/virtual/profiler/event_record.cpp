@@ -26,7 +26,7 @@ event_record make_record(std::uint32_t category, std::uint32_t component, std::u
     return record;
 }
 
-// Adds the data of a bus transfer, in records of up to 24 bytes with the same time stamp.
+// Adds the data of a bus transfer, in records of up to 24 bytes with the same timestamp.
 void add_transfer_data(std::vector<event_record>& records, std::uint32_t component,
                        std::uint8_t channel, std::uint64_t number, machine_clock::time time,
                        std::uint32_t& sequence_num) {

@@ -86,7 +86,7 @@ constexpr std::array statistics_rows{
     statistics_row{2, 1, 42},                 // single clicks
     statistics_row{6, 11, 7'733'248},         // duration: 118.0
     statistics_row{5, 24, q16_16(12.40625)},  // proximity signal
-    statistics_row{1, 19, 0},                 // time-outs are reset
+    statistics_row{1, 19, 0},                 // timeouts are reset
     statistics_row{0, 57, 0},
 };
 
@@ -127,18 +127,18 @@ public:
         const std::size_t next = next_kind();
         const auto ticks = std::chrono::duration<double>(time_of(next)).count() / tick_period();
         hid_notification notification =
-            kind_rows[next].make(static_cast<std::uint64_t>(ticks), made_[next]);
+            kind_rows[next].make(static_cast<std::uint64_t>(ticks), emitted_[next]);
         if (auto* event = std::get_if<hid_event>(&notification)) {
             event->latency_nanoseconds = time(kind_rows[next].latency).count();
         }
-        ++made_[next];
+        ++emitted_[next];
         return notification;
     }
 
 private:
     [[nodiscard]] time time_of(std::size_t kind) const {
         const kind_row& row = kind_rows[kind];
-        const std::uint64_t n = made_[kind];
+        const std::uint64_t n = emitted_[kind];
         const bool is_late = row.late_every != 0 && n % row.late_every == row.late_every - 1;
         return start_ + row.first + static_cast<time::rep>(n) * time(row.interval) +
                (is_late ? time(delay) : time(0));
@@ -154,7 +154,7 @@ private:
     }
 
     const time start_;
-    std::array<std::uint64_t, kind_rows.size()> made_{};  // number of each kind
+    std::array<std::uint64_t, kind_rows.size()> emitted_{};  // number of each kind
 };
 
 }  // namespace

@@ -169,10 +169,10 @@ consteval report_bytes<entry_size> pack_client(const client_row& row) {
 }
 
 consteval std::array<report_bytes<entry_size>, clients.size()> pack_clients() {
-    std::array<report_bytes<entry_size>, clients.size()> all{};
-    for (std::size_t i = 0; i < all.size(); ++i)
-        all[i] = pack_client(clients[i]);
-    return all;
+    std::array<report_bytes<entry_size>, clients.size()> packed{};
+    for (std::size_t i = 0; i < packed.size(); ++i)
+        packed[i] = pack_client(clients[i]);
+    return packed;
 }
 
 constexpr auto packed_clients = pack_clients();

@@ -222,10 +222,10 @@ consteval packed_sensor pack(const sensor_row& row) {
 }
 
 consteval std::array<packed_sensor, sensors.size()> pack_all() {
-    std::array<packed_sensor, sensors.size()> all{};
-    for (std::size_t i = 0; i < all.size(); ++i)
-        all[i] = pack(sensors[i]);
-    return all;
+    std::array<packed_sensor, sensors.size()> packed{};
+    for (std::size_t i = 0; i < packed.size(); ++i)
+        packed[i] = pack(sensors[i]);
+    return packed;
 }
 
 constexpr auto packed_sensors = pack_all();
