@@ -30,9 +30,9 @@ constexpr std::array long_options{
 
 int run(int argc, char** argv) {
     if (argc == 0) print_usage("keyprobe");
-    ::unsetenv(
-        "POSIXLY_CORRECT");  // would end the parsing at the first argument that is not an option
-    optind = 0;              // resets the parser, which an earlier run may have used
+    // POSIXLY_CORRECT would end the parsing at the first argument that is not an option.
+    ::unsetenv("POSIXLY_CORRECT");
+    optind = 0;  // resets the parser, which an earlier run may have used
     while (true) {
         // -b and -f ARGUMENT are known so that the parser prints no message of its own for them
         // before the usage line.

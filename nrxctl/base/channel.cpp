@@ -15,17 +15,17 @@ platform::return_code open_connection(const platform::service& service, std::uin
 }
 
 platform::return_code open_channel(platform::service service, std::uint32_t type,
-                                   service_channel& opened) {
-    opened.service = std::move(service);
-    if (!check(opened.service, condition::service)) return platform::not_found;
-    return open_connection(opened.service, type, opened.connection);
+                                   service_channel& channel) {
+    channel.service = std::move(service);
+    if (!check(channel.service, condition::service)) return platform::not_found;
+    return open_connection(channel.service, type, channel.connection);
 }
 
-platform::return_code open_channel(std::string_view service_name, service_channel& opened,
+platform::return_code open_channel(std::string_view service_name, service_channel& channel,
                                    on_failure on_missing) {
     platform::service service = find_service(service_name);
     if (!service && on_missing == on_failure::ignore) return platform::not_found;
-    return open_channel(std::move(service), 0, opened);
+    return open_channel(std::move(service), 0, channel);
 }
 
 }  // namespace nrx

@@ -1,4 +1,4 @@
-// A connection to an interface service for the length of one operation.
+// A connection to a service for the length of one operation.
 #pragma once
 
 #include <cstdint>
@@ -26,11 +26,11 @@ platform::return_code open_connection(const platform::service& service, std::uin
 // Opens a channel of the given connection type on a service that was looked up before. Fails with a
 // failure report: with not_found if the service is empty, otherwise as open_connection does.
 platform::return_code open_channel(platform::service service, std::uint32_t type,
-                                   service_channel& opened);
+                                   service_channel& channel);
 
-// Finds a service by name and opens a channel of type 0 on it. Fails as above; a missing service is
-// reported or not as on_missing says.
-platform::return_code open_channel(std::string_view service_name, service_channel& opened,
+// Finds a service by name and opens a channel of type 0 on it. Fails as above; on_missing decides
+// whether a missing service is reported.
+platform::return_code open_channel(std::string_view service_name, service_channel& channel,
                                    on_failure on_missing = on_failure::report);
 
 }  // namespace nrx

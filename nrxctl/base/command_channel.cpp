@@ -66,8 +66,8 @@ platform::dictionary match_hid_driver() {
 platform::return_code get_report(std::string_view service_name, report_id id,
                                  platform::byte_span& report) {
     service_channel channel;
-    const auto opened = open_channel(service_name, channel);
-    if (opened != platform::success) return opened;
+    const auto open_result = open_channel(service_name, channel);
+    if (open_result != platform::success) return open_result;
     const auto kr = call_with_id(channel, read_report_selector, id, {}, report);
     check_success(kr, condition::kr_is_zero);
     return kr;
@@ -76,16 +76,16 @@ platform::return_code get_report(std::string_view service_name, report_id id,
 platform::return_code get_report_quiet(std::string_view service_name, report_id id,
                                        platform::byte_span& report) {
     service_channel channel;
-    const auto opened = open_channel(service_name, channel, on_failure::ignore);
-    if (opened != platform::success) return opened;
+    const auto open_result = open_channel(service_name, channel, on_failure::ignore);
+    if (open_result != platform::success) return open_result;
     return call_with_id(channel, read_report_selector, id, {}, report);
 }
 
 platform::return_code set_report(std::string_view service_name, report_id id,
                                  platform::byte_view report) {
     service_channel channel;
-    const auto opened = open_channel(service_name, channel);
-    if (opened != platform::success) return opened;
+    const auto open_result = open_channel(service_name, channel);
+    if (open_result != platform::success) return open_result;
     platform::byte_span no_response;
     const auto kr = call_with_id(channel, write_report_selector, id, report, no_response);
     check_success(kr, condition::kr_is_zero);
@@ -96,8 +96,8 @@ platform::return_code send_command(std::string_view service_name, std::uint32_t 
                                    platform::byte_view payload, platform::byte_span& response,
                                    on_failure on_call_failure) {
     service_channel channel;
-    const auto opened = open_channel(service_name, channel);
-    if (opened != platform::success) return opened;
+    const auto open_result = open_channel(service_name, channel);
+    if (open_result != platform::success) return open_result;
     const auto kr = call_with_id(channel, command_selector, command, payload, response);
     if (on_call_failure == on_failure::ignore) return kr;
     if (kr == platform::unsupported) print_unsupported(command, payload);
@@ -108,8 +108,8 @@ platform::return_code send_command(std::string_view service_name, std::uint32_t 
 platform::return_code call_scalar_method(std::string_view service_name,
                                          std::span<const std::uint64_t> scalars) {
     service_channel channel;
-    const auto opened = open_channel(service_name, channel);
-    if (opened != platform::success) return opened;
+    const auto open_result = open_channel(service_name, channel);
+    if (open_result != platform::success) return open_result;
     platform::byte_span no_response;
     const auto kr = call(channel, scalar_selector, {scalars, {}}, no_response);
     check_success(kr, condition::kr_is_zero);
@@ -120,8 +120,8 @@ platform::return_code set_named_property(std::string_view service_name,
                                          std::string_view property_name,
                                          platform::byte_view value) {
     service_channel channel;
-    const auto opened = open_channel(service_name, channel);
-    if (opened != platform::success) return opened;
+    const auto open_result = open_channel(service_name, channel);
+    if (open_result != platform::success) return open_result;
     // The message is the name with its NUL, then the value.
     const std::size_t name_size = property_name.size() + 1;
     const std::size_t size = name_size + value.size();
@@ -142,8 +142,8 @@ platform::return_code get_named_property(std::string_view service_name,
                                          std::string_view property_name,
                                          platform::byte_span& value) {
     service_channel channel;
-    const auto opened = open_channel(service_name, channel);
-    if (opened != platform::success) return opened;
+    const auto open_result = open_channel(service_name, channel);
+    if (open_result != platform::success) return open_result;
     std::vector<std::uint8_t> name(property_name.begin(), property_name.end());
     name.push_back(0);
     const auto kr = call(channel, get_property_selector, {{}, name}, value);
@@ -154,9 +154,9 @@ platform::return_code get_named_property(std::string_view service_name,
 
 platform::return_code call_hid_driver(platform::byte_view input, platform::byte_span& output) {
     service_channel channel;
-    const auto opened =
+    const auto open_result =
         open_channel(platform::first_match(match_hid_driver()), hid_client_type, channel);
-    if (opened != platform::success) return opened;
+    if (open_result != platform::success) return open_result;
     const auto kr = call(channel, hid_structure_selector, {{}, input}, output);
     check_success(kr, condition::kr_is_zero);
     return kr;

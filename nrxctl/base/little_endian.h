@@ -11,8 +11,8 @@
 
 namespace nrx {
 
-// The number in the first sizeof(Number) bytes at source. A single expression, which compilers turn
-// into one load; a loop they do not.
+// The number in the first sizeof(Number) bytes at source. Written as a single expression because
+// compilers turn that into one load, but not a loop.
 template <std::integral Number>
 constexpr Number load_le(const std::uint8_t* source) {
     using bits = std::make_unsigned_t<Number>;
@@ -31,7 +31,7 @@ constexpr void store_le(std::uint8_t* target, Number value) {
     }
 }
 
-// Appends the low width bytes of a number, least significant first.
+// Appends the lowest bytes of a number, as many as width says, least significant first.
 inline void append_le(std::vector<std::uint8_t>& bytes, std::uint64_t value, std::size_t width) {
     for (std::size_t i = 0; i < width; ++i) {
         bytes.push_back(static_cast<std::uint8_t>(value >> (8 * i)));

@@ -23,13 +23,15 @@ protected:
         device = create_hid_device(service_named("button"));
     }
 
-    // Reads a report into a zeroed buffer, which a failure must leave as it was.
+    // Reads a report into a zeroed buffer. A failure must leave the span and the buffer as they
+    // were.
     void read(std::uint8_t id, std::size_t capacity, return_code code,
               const byte_list& bytes = {}) {
         byte_list buffer(capacity);
         byte_span report = buffer;
         EXPECT_EQ(read_feature_report(device, id, report), code);
-        EXPECT_EQ(byte_list(report.begin(), report.end()), code == success ? bytes : buffer);
+        EXPECT_EQ(byte_list(report.begin(), report.end()),
+                  code == success ? bytes : byte_list(capacity));
     }
 
     std::shared_ptr<virtual_hid_device> hid = std::make_shared<virtual_hid_device>();

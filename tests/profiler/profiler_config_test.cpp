@@ -24,10 +24,10 @@ std::string described(const std::vector<nrx::profiler_config>& configs) {
 }
 
 TEST(profiler_config, record_has_52_bytes_and_every_field_at_its_offset) {
-    const byte_list record =
-        u32_report({10, 0x04030201, 1, 0x08070605, 0x006c6c61, 0x736e6573, 0x78, 4, 5, 6, 7, 8, 0});
+    const byte_list record = u32_report(
+        {10, 0x04030201, 0x0a090001, 0x08070605, 0x006c6c61, 0x736e6573, 0x78, 4, 5, 6, 7, 8, 0});
     const auto decoded = nrx::decode_configs(record);
-    EXPECT_EQ(described(decoded), "10.67305985 1 8070605 6c6c61 736e6573 78 4 5 6 7 8");
+    EXPECT_EQ(described(decoded), "10.67305985 168361985 8070605 6c6c61 736e6573 78 4 5 6 7 8");
     EXPECT_EQ(nrx::encode_configs(decoded), record);
     byte_list two = joined({record, record});
     EXPECT_EQ(nrx::decode_configs(two).size(), 2U);

@@ -29,7 +29,7 @@ block* block_of(void* event) {
     return reinterpret_cast<block*>(static_cast<std::byte*>(event) - offset);
 }
 
-// The first block may never be full, so it is mapped as it is used.
+// The first block may never fill up, so it does not ask for huge pages.
 block* make_block(bool is_first) {
     void* memory = std::aligned_alloc(block_size, block_size);
     if (memory == nullptr) throw std::bad_alloc();
