@@ -16,8 +16,8 @@ namespace {
 std::optional<std::int64_t> parse(std::string_view text) {
     std::optional<std::int64_t> value;
     std::optional<std::int64_t> fast_value;
-    fuzz::completes([&] { value = nrx::parse_number(text, "not a number"); });
-    fuzz::completes([&] { fast_value = nrx::parse_fast_number(text, "not a number"); });
+    fuzz::run_to_completion([&] { value = nrx::parse_number(text, "not a number"); });
+    fuzz::run_to_completion([&] { fast_value = nrx::parse_fast_number(text, "not a number"); });
     fuzz::require(value == fast_value);
     return value;
 }

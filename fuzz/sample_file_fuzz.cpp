@@ -39,7 +39,7 @@ private:
 
 std::optional<nrx::sample_groups> read(const std::string& path) {
     std::optional<nrx::sample_groups> groups;
-    fuzz::completes([&] { groups = nrx::read_sample_file(path); });
+    fuzz::run_to_completion([&] { groups = nrx::read_sample_file(path); });
     return groups;
 }
 
@@ -68,7 +68,7 @@ std::optional<nrx::sample_groups> read_plainly(std::string_view text) {
         if (!nrx::split_sample_line(text_of_line, line)) return std::nullopt;
         auto event = nrx::is_skipped(line.tag) ? nullptr : nrx::make_event(line.tag);
         if (!event) continue;
-        if (!fuzz::completes([&] { event->parse(line.values); })) return std::nullopt;
+        if (!fuzz::run_to_completion([&] { event->parse(line.values); })) return std::nullopt;
         groups[event->name()].push_back(std::move(event));
     }
     for (auto& [name, events] : groups)
