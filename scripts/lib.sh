@@ -2,7 +2,8 @@
 # shellcheck shell=bash disable=SC2034
 
 root=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
-script="scripts/$(basename "$0")"
+script_file=$(readlink -f "$0")
+script=scripts/$(basename "$script_file")
 jobs=$(nproc)
 
 readonly build_packages=(g++ cmake ninja-build)
@@ -17,6 +18,24 @@ say() {
 die() {
     say "$*"
     exit 1
+}
+
+# Prints the comment at the top of the script.
+usage() {
+    sed -n '1d; /^#/!q; s/^# \{0,1\}//p' "$script_file"
+}
+
+# handle_help "$@": prints the usage and ends if the first argument asks for it.
+handle_help() {
+    [[ ${1-} == --help || ${1-} == -h ]] || return 0
+    usage
+    exit 0
+}
+
+usage_error() {
+    say "$*"
+    usage >&2
+    exit 2
 }
 
 is_installed() {
