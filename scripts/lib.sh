@@ -38,34 +38,62 @@ usage_error() {
     exit 2
 }
 
+# Without dpkg, a package counts as installed if its command is; CMake looks for the libraries.
 is_installed() {
-    [[ $(dpkg-query -W -f='${db:Status-Status}' "$1" 2>/dev/null) == installed ]]
+    if command -v dpkg-query >/dev/null; then
+        [[ $(dpkg-query -W -f='${db:Status-Status}' "$1" 2>/dev/null) == installed ]]
+    else
+        [[ $1 == *-dev ]] || command -v "${1%-build}" >/dev/null
+    fi
+}
+
+# may_install PACKAGE...: whether installing is allowed and possible. Asks before sudo is used, or, where nobody
+# can be asked, uses it only if it needs no password.
+may_install() {
+    [[ ${KEYPROBE_NO_INSTALL:-0} == 0 ]] && command -v apt-get >/dev/null || return 1
+    ((EUID != 0)) || return 0
+    command -v sudo >/dev/null || return 1
+    if [[ -t 0 && -t 2 ]]; then
+        local reply
+        read -rp "$script: install $* with sudo? [y/N] " reply || echo >&2
+        [[ $reply == [yY]* ]]
+    else
+        sudo -n true &>/dev/null
+    fi
 }
 
 apt() {
     local -a sudo=()
-    if ((EUID != 0)); then
-        command -v sudo >/dev/null || die "not root, and sudo is not installed: run as root: apt-get $*"
-        sudo=(sudo)
-    fi
-    "${sudo[@]}" env DEBIAN_FRONTEND=noninteractive \
-        apt-get -qq -o DPkg::Lock::Timeout=300 "$@" </dev/null >&2
+    ((EUID == 0)) || sudo=(sudo)
+    "${sudo[@]}" env DEBIAN_FRONTEND=noninteractive apt-get -qq -o DPkg::Lock::Timeout=300 "$@" </dev/null
 }
 
-# ensure_packages NAME...: installs the Debian packages that are missing.
+# The package lists may be absent, or so old that they name files that are gone.
+install_packages() {
+    apt install -y --no-install-recommends "$@" && return
+    apt update && apt install -y --no-install-recommends "$@"
+}
+
+# ensure_packages NAME...: installs the Debian packages that are missing. If it must not or cannot, it
+# says what to install, and ends.
 ensure_packages() {
     local -a missing=()
-    local name
+    local name log=build/install.log
     for name in "$@"; do
         is_installed "$name" || missing+=("$name")
     done
     ((${#missing[@]})) || return 0
-    command -v apt-get >/dev/null || die "this is not a Debian machine; install these packages yourself: ${missing[*]}"
-    say "installing ${missing[*]}"
-    if ! apt install --simulate --no-install-recommends "${missing[@]}" &>/dev/null; then
-        apt update || die "cannot update the package lists"
+    if ! may_install "${missing[@]}"; then
+        say "missing packages: ${missing[*]}"
+        command -v apt-get >/dev/null || die "this is not a Debian machine; install what these Debian packages contain"
+        die "install them, as root, with: apt-get install ${missing[*]}"
     fi
-    apt install -y --no-install-recommends "${missing[@]}" || die "cannot install ${missing[*]}"
+    { mkdir -p "$root/build" && : >"$root/$log"; } || die "cannot write $log"
+    say "installing ${missing[*]}"
+    install_packages "${missing[@]}" &>"$root/$log" && return
+    say "cannot install ${missing[*]}; the end of $log:"
+    tail -n 5 "$root/$log" >&2
+    exit 1
 }
 
 # quietly COMMAND...: runs a command and shows its output only if it fails.
