@@ -3,10 +3,11 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
+#include <cstdlib>
+#include <filesystem>
 #include <optional>
 #include <string>
 #include <string_view>
-#include <sys/mman.h>
 #include <unistd.h>
 
 #include "fuzz/support/harness.h"
@@ -19,21 +20,25 @@ std::uint32_t word_at(const nrx::VirtualEvent& event, std::size_t offset) {
     return nrx::load_le<std::uint32_t>(event.data() + offset);
 }
 
-// A file in memory that has a path and is refilled for each input.
-class memory_file {
+// A file that is refilled for each input. A failed run leaves it behind.
+class temporary_file {
 public:
-    explicit memory_file(const char* name) : file_(::memfd_create(name, MFD_CLOEXEC)) {}
-    ~memory_file() { ::close(file_); }
-    memory_file(const memory_file&) = delete;
-    memory_file& operator=(const memory_file&) = delete;
+    temporary_file() : file_(::mkstemp(path_.data())) { fuzz::require(file_ >= 0); }
+    ~temporary_file() {
+        ::close(file_);
+        ::unlink(path_.c_str());
+    }
+    temporary_file(const temporary_file&) = delete;
+    temporary_file& operator=(const temporary_file&) = delete;
 
     void fill(const std::uint8_t* data, std::size_t size) const {
-        fuzz::require(::ftruncate(file_, 0) == 0);
         fuzz::require(::pwrite(file_, data, size, 0) == static_cast<ssize_t>(size));
+        fuzz::require(::ftruncate(file_, static_cast<off_t>(size)) == 0);
     }
-    [[nodiscard]] std::string path() const { return "/proc/self/fd/" + std::to_string(file_); }
+    [[nodiscard]] const std::string& path() const { return path_; }
 
 private:
+    std::string path_ = std::filesystem::temp_directory_path() / "samples-XXXXXX";
     int file_;
 };
 
@@ -98,7 +103,7 @@ void check_same_events(const nrx::sample_groups& groups, const nrx::sample_group
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    static const memory_file file("samples");
+    static const temporary_file file;
     file.fill(data, size);
     const auto groups = read(file.path());
     const auto expected = read_plainly(fuzz::as_text(data, size));

@@ -1,6 +1,7 @@
 #include "tests/replay/replay_host.h"
 
-#include <sys/mman.h>
+#include <cstdio>
+#include <fstream>
 #include <unistd.h>
 
 #include "nrxctl/replay/replay_command.h"
@@ -8,10 +9,12 @@
 namespace tests {
 
 std::string sample_file(std::string_view text) {
-    static const int file = ::memfd_create("samples", MFD_CLOEXEC);
-    EXPECT_EQ(::ftruncate(file, 0), 0);
-    EXPECT_EQ(::pwrite(file, text.data(), text.size(), 0), static_cast<ssize_t>(text.size()));
-    return "/proc/self/fd/" + std::to_string(file);
+    static const struct temporary_file {
+        ~temporary_file() { std::remove(path.c_str()); }
+        std::string path = testing::TempDir() + "samples-" + std::to_string(::getpid());
+    } file;
+    std::ofstream(file.path, std::ios::binary) << text;
+    return file.path;
 }
 
 int run_replay(const lines& arguments) {

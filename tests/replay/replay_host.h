@@ -11,7 +11,7 @@
 
 namespace tests {
 
-// Writes a file of samples in memory and returns its path. The next call overwrites the file.
+// Writes a temporary file of samples and returns its path. The next call overwrites the file.
 std::string sample_file(std::string_view text);
 
 // Runs a subcommand, which is the first argument. Returns how many of the others it read.
