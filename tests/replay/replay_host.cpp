@@ -8,11 +8,21 @@
 
 namespace tests {
 
+namespace {
+
+struct temporary_file {
+    temporary_file() = default;
+    ~temporary_file() { std::remove(path.c_str()); }
+    temporary_file(const temporary_file&) = delete;
+    temporary_file& operator=(const temporary_file&) = delete;
+
+    std::string path = testing::TempDir() + "samples-" + std::to_string(::getpid());
+};
+
+}  // namespace
+
 std::string sample_file(std::string_view text) {
-    static const struct temporary_file {
-        ~temporary_file() { std::remove(path.c_str()); }
-        std::string path = testing::TempDir() + "samples-" + std::to_string(::getpid());
-    } file;
+    static const temporary_file file;
     std::ofstream(file.path, std::ios::binary) << text;
     return file.path;
 }
