@@ -28,10 +28,17 @@ void count_interrupt() {
     if (on_handle) on_handle();
 }
 
-bool has_default_action() {
+using action = void (*)(int);
+
+action action_of(int signal) {
     struct sigaction current {};
-    ::sigaction(SIGINT, nullptr, &current);
-    return current.sa_handler == SIG_DFL;
+    ::sigaction(signal, nullptr, &current);
+    return current.sa_handler;
+}
+
+bool has_default_action() {
+    return action_of(SIGINT) == SIG_DFL && action_of(SIGTERM) == SIG_DFL &&
+           action_of(SIGHUP) == SIG_DFL;
 }
 
 }  // namespace
@@ -49,26 +56,60 @@ protected:
     }
 };
 
-TEST_F(interrupts, are_handled_once_when_a_platform_call_returns) {
-    std::raise(SIGINT);
-    std::raise(SIGINT);
-    EXPECT_EQ(handled, 0);
-    service_named("nobody");
-    EXPECT_EQ(handled, 1);
-    service_named("nobody");
-    EXPECT_EQ(handled, 1);
-}
-
-TEST_F(interrupts, raised_inside_the_handler_are_handled_afterwards) {
-    on_handle = [] {
-        if (handled > 1) return;
-        std::raise(SIGINT);
+TEST_F(interrupts, of_each_kind_are_handled_once_when_a_platform_call_returns) {
+    const std::vector<std::function<void()>> kinds{
+        [] { std::raise(SIGINT); }, [] { std::raise(SIGTERM); }, [] { std::raise(SIGHUP); },
+        [] {
+            request_interrupt();
+            request_interrupt();
+        }};
+    for (const auto& interrupt : kinds) {
+        set_interrupt_handler(count_interrupt);
+        handled = 0;
+        interrupt();
+        EXPECT_EQ(handled, 0);
         service_named("nobody");
         EXPECT_EQ(handled, 1);
+        request_interrupt();  // too late: the handler has run
+        service_named("nobody");
+        EXPECT_EQ(handled, 1);
+    }
+}
+
+TEST_F(interrupts, restore_the_default_actions_for_a_second_signal) {
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP}) {
+        set_interrupt_handler(count_interrupt);
+        EXPECT_FALSE(has_default_action());
+        std::raise(signal);
+        EXPECT_TRUE(has_default_action());
+    }
+}
+
+TEST_F(interrupts, leave_an_ignored_hang_up_ignored) {
+    restore_default_interrupt();
+    std::signal(SIGHUP, SIG_IGN);
+    set_interrupt_handler(count_interrupt);
+    EXPECT_EQ(action_of(SIGHUP), SIG_IGN);
+    std::raise(SIGTERM);
+    EXPECT_EQ(action_of(SIGHUP), SIG_IGN);
+    restore_default_interrupt();
+    EXPECT_EQ(action_of(SIGHUP), SIG_IGN);
+    std::signal(SIGHUP, SIG_DFL);
+}
+
+TEST_F(interrupts, requested_inside_the_handler_or_without_one_have_no_effect) {
+    on_handle = [] {
+        request_interrupt();
+        service_named("nobody");
     };
-    std::raise(SIGINT);
+    request_interrupt();
     service_named("nobody");
-    EXPECT_EQ(handled, 2);
+    EXPECT_EQ(handled, 1);
+    restore_default_interrupt();
+    request_interrupt();
+    set_interrupt_handler(count_interrupt);
+    service_named("nobody");
+    EXPECT_EQ(handled, 1);
 }
 
 TEST_F(interrupts, if_pending_are_handled_before_the_default_is_restored) {
@@ -208,9 +249,11 @@ TEST_F(event_loops, are_stopped_by_an_interrupt_at_any_time) {
         if (record == 1) std::raise(SIGINT);
     };
     EXPECT_EQ(run(), (callbacks{{1, 10ms}}));
+    set_interrupt_handler(stop_loop);
     host.clock().run_at(40ms, [] { std::raise(SIGINT); });
     EXPECT_EQ(run(), (callbacks{{2, 20ms}}));
     EXPECT_EQ(host.clock().now(), 40ms);
+    set_interrupt_handler(stop_loop);
     std::raise(SIGINT);
     EXPECT_EQ(run(), callbacks());
 }
