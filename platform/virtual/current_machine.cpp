@@ -3,9 +3,16 @@
 #include <memory>
 #include <utility>
 
+#include "platform/host.h"
 #include "platform/virtual/wrist_device.h"
 
-namespace platform::simulated {
+namespace platform {
+
+std::string host_description() {
+    return simulated::current_machine().description();
+}
+
+namespace simulated {
 
 namespace {
 
@@ -27,4 +34,6 @@ installed_machine::~installed_machine() {
     installed = previous_;
 }
 
-}  // namespace platform::simulated
+}  // namespace simulated
+
+}  // namespace platform

@@ -68,6 +68,10 @@ public:
     void set_boot_time(calendar_instant boot_time) { boot_time_ = boot_time; }
     [[nodiscard]] std::optional<calendar_instant> boot_time() const { return boot_time_; }
 
+    // What answers, for people.
+    void set_description(std::string description) { description_ = std::move(description); }
+    [[nodiscard]] const std::string& description() const { return description_; }
+
     // The HID event system; empty until it is set.
     void set_hid_events(hid_event_source_factory factory) { hid_events_ = std::move(factory); }
     [[nodiscard]] const hid_event_source_factory& hid_events() const { return hid_events_; }
@@ -147,6 +151,7 @@ private:
     std::vector<entry_ref> entries_;
     std::map<std::string, std::vector<entry_ref>, std::less<>> by_class_;
     std::optional<calendar_instant> boot_time_;
+    std::string description_ = "virtual NRX";
     hid_event_source_factory hid_events_;
     handle_table handles_;
     machine_clock clock_;

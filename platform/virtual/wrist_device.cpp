@@ -6,6 +6,7 @@ namespace platform::simulated {
 
 std::unique_ptr<machine> make_wrist_device() {
     auto device = std::make_unique<machine>();
+    device->set_description("virtual NRX, embedded");
     device->clock().follow_host();
     add_interface_services(*device);
     add_named_properties(*device);
