@@ -7,6 +7,7 @@
 
 #include "fuzz/support/argument_list.h"
 #include "fuzz/support/harness.h"
+#include "nrxctl/base/end_process.h"
 #include "nrxctl/profiler/config_parser.h"
 
 namespace {
@@ -21,7 +22,7 @@ struct parse_result {
 
 parse_result parse(std::string_view argument) {
     parse_result result;
-    result.completed = fuzz::run_to_completion(
+    result.completed = nrx::run_to_completion(
         [&] { result.valid = nrx::parse_profiler_config(argument, result.configs); });
     return result;
 }
@@ -60,7 +61,7 @@ void check_arguments(const fuzz::argument_list& list) {
     config_list configs;
     bool valid = false;
     const bool completed =
-        fuzz::run_to_completion([&] { valid = nrx::parse_profiler_configs(arguments, configs); });
+        nrx::run_to_completion([&] { valid = nrx::parse_profiler_configs(arguments, configs); });
     fuzz::require((completed && valid) == all_valid);
     fuzz::require(nrx::encode_configs(configs) == nrx::encode_configs(expected));
     fuzz::require(index <= list.count());

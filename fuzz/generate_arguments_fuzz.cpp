@@ -8,6 +8,7 @@
 
 #include "fuzz/support/argument_list.h"
 #include "fuzz/support/harness.h"
+#include "nrxctl/base/end_process.h"
 #include "nrxctl/base/little_endian.h"
 #include "nrxctl/replay/generate_samples.h"
 #include "nrxctl/replay/sample_line.h"
@@ -21,7 +22,7 @@ std::optional<nrx::signal_request> read_request(const fuzz::argument_list& list)
     int index = 0;
     nrx::argument_cursor arguments(list.arguments(), index);
     std::optional<nrx::signal_request> request;
-    fuzz::run_to_completion([&] { request = nrx::read_signal_request(arguments); });
+    nrx::run_to_completion([&] { request = nrx::read_signal_request(arguments); });
     fuzz::require(!request || index == 4);
     return request;
 }
@@ -30,7 +31,7 @@ void check_line(const std::string& line, const nrx::signal_request& request, std
     nrx::sample_line split;
     fuzz::require(nrx::split_sample_line(line, split) && split.tag == request.service);
     const auto event = nrx::make_event(split.tag);
-    fuzz::require(fuzz::run_to_completion([&] { event->parse(split.values); }));
+    fuzz::require(nrx::run_to_completion([&] { event->parse(split.values); }));
     fuzz::require(nrx::load_le<std::uint32_t>(event->data() + 8) == number);
     const auto value = nrx::load_le<std::int32_t>(event->data() + 16);
     fuzz::require(value >= -0x10000 && value <= 0x10000);

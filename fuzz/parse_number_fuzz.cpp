@@ -8,6 +8,7 @@
 #include <string_view>
 
 #include "fuzz/support/harness.h"
+#include "nrxctl/base/end_process.h"
 #include "nrxctl/base/numbers.h"
 #include "nrxctl/replay/fast/fast_number.h"
 
@@ -16,8 +17,8 @@ namespace {
 std::optional<std::int64_t> parse(std::string_view text) {
     std::optional<std::int64_t> value;
     std::optional<std::int64_t> fast_value;
-    fuzz::run_to_completion([&] { value = nrx::parse_number(text, "not a number"); });
-    fuzz::run_to_completion([&] { fast_value = nrx::parse_fast_number(text, "not a number"); });
+    nrx::run_to_completion([&] { value = nrx::parse_number(text, "not a number"); });
+    nrx::run_to_completion([&] { fast_value = nrx::parse_fast_number(text, "not a number"); });
     fuzz::require(value == fast_value);
     return value;
 }

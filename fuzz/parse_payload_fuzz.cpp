@@ -9,6 +9,7 @@
 
 #include "fuzz/support/argument_list.h"
 #include "fuzz/support/harness.h"
+#include "nrxctl/base/end_process.h"
 #include "nrxctl/base/payload.h"
 
 namespace {
@@ -49,7 +50,7 @@ void check_payload(const fuzz::argument_list& list, int first, int position,
     std::vector<std::uint8_t> reparsed;
     int end = 0;
     fuzz::require(
-        fuzz::run_to_completion([&] { nrx::parse_payload(formatted.arguments(), end, reparsed); }));
+        nrx::run_to_completion([&] { nrx::parse_payload(formatted.arguments(), end, reparsed); }));
     fuzz::require(end == formatted.count() && reparsed == payload);
 }
 
@@ -61,7 +62,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const int first = data[0] % 4;
     int position = first;
     std::vector<std::uint8_t> payload{0xee};  // earlier content must go
-    if (fuzz::run_to_completion([&] { nrx::parse_payload(list.arguments(), position, payload); })) {
+    if (nrx::run_to_completion([&] { nrx::parse_payload(list.arguments(), position, payload); })) {
         check_payload(list, first, position, payload);
     }
     return 0;

@@ -11,6 +11,7 @@
 #include <unistd.h>
 
 #include "fuzz/support/harness.h"
+#include "nrxctl/base/end_process.h"
 #include "nrxctl/base/little_endian.h"
 #include "nrxctl/replay/sample_file.h"
 
@@ -44,7 +45,7 @@ private:
 
 std::optional<nrx::sample_groups> read(const std::string& path) {
     std::optional<nrx::sample_groups> groups;
-    fuzz::run_to_completion([&] { groups = nrx::read_sample_file(path); });
+    nrx::run_to_completion([&] { groups = nrx::read_sample_file(path); });
     return groups;
 }
 
@@ -73,7 +74,7 @@ std::optional<nrx::sample_groups> read_plainly(std::string_view text) {
         if (!nrx::split_sample_line(text_of_line, line)) return std::nullopt;
         auto event = nrx::is_skipped(line.tag) ? nullptr : nrx::make_event(line.tag);
         if (!event) continue;
-        if (!fuzz::run_to_completion([&] { event->parse(line.values); })) return std::nullopt;
+        if (!nrx::run_to_completion([&] { event->parse(line.values); })) return std::nullopt;
         groups[event->name()].push_back(std::move(event));
     }
     for (auto& [name, events] : groups)

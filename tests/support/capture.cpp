@@ -3,10 +3,12 @@
 #include <algorithm>
 #include <array>
 #include <cstdio>
+#include <cstdlib>
 #include <string_view>
 #include <sys/mman.h>
 #include <unistd.h>
 
+#include "nrxctl/base/end_process.h"
 #include "nrxctl/base/output.h"
 
 namespace tests {
@@ -50,12 +52,7 @@ private:
 
 // Runs action. Returns the exit status if it would have ended the process.
 std::optional<int> exit_status(const std::function<void()>& action) {
-    try {
-        action();
-    } catch (const process_ended& end) {
-        return end.status;
-    }
-    return std::nullopt;
+    return nrx::run_to_completion(action) ? std::nullopt : std::optional(EXIT_FAILURE);
 }
 
 }  // namespace

@@ -7,11 +7,6 @@
 
 namespace tests {
 
-// Thrown in place of the end of the process.
-struct process_ended {
-    int status;
-};
-
 struct outcome {
     std::string out;            // standard output
     std::string err;            // standard error without line numbers of source files
