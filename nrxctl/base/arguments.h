@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <limits>
 #include <optional>
 #include <span>
 #include <string_view>
@@ -23,6 +24,9 @@ public:
     // The number of arguments still to be read.
     [[nodiscard]] std::size_t remaining() const;
 
+    // The argument that the n-th call of next() from now returns, from 0; nullopt if there is none.
+    [[nodiscard]] std::optional<std::string_view> peek(std::size_t n) const;
+
     // Puts an argument in front of the remaining ones, such as the option's own.
     void prepend(std::string_view argument) { prepended_ = argument; }
 
@@ -40,16 +44,37 @@ auto find_keyword(const Table& table, std::string_view argument) -> decltype(tab
     return match == table.end() ? nullptr : &*match;
 }
 
+// What a check of arguments found.
+enum class arguments_check {
+    accepted,
+    refused,  // the messages have been written that a run would write
+    misused,  // a run would ignore or misread an argument; an explanation has been given
+};
+
 // A subcommand of a command family.
 struct subcommand_row {
+    static constexpr std::size_t any_number = std::numeric_limits<std::size_t>::max();
+
     std::string_view keyword;
-    // Reads its own arguments and reports its own failures.
+    // Reads its own arguments and reports its own failures. Ignores arguments beyond the maximum.
     void (*run)(argument_cursor& arguments);
+    std::size_t max_arguments = 0;
+    // Reads the arguments as run does, with the same messages, but does nothing else. Null if there
+    // is nothing to check but their number.
+    arguments_check (*check)(argument_cursor& arguments) = nullptr;
 };
 
 // Runs the subcommand with that keyword. Returns false if the table has none.
 bool run_subcommand(std::span<const subcommand_row> table, std::string_view keyword,
                     argument_cursor& arguments);
+
+// Checks the arguments of a subcommand: none may be left unread, or be one too many.
+arguments_check check_subcommand(const subcommand_row& subcommand, argument_cursor& arguments);
+
+// accepted or refused.
+constexpr arguments_check checked(bool accepted) {
+    return accepted ? arguments_check::accepted : arguments_check::refused;
+}
 
 // Prints "message (argument)" as a line on standard output and ends the process with status 1.
 [[noreturn]] void reject_argument(std::string_view message, std::string_view argument);

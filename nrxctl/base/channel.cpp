@@ -25,6 +25,7 @@ platform::return_code open_channel(std::string_view service_name, service_channe
                                    on_failure on_missing) {
     platform::service service = find_service(service_name);
     if (!service && on_missing == on_failure::ignore) return platform::not_found;
+    if (!service) explain_missing_service(service_name);
     return open_channel(std::move(service), 0, channel);
 }
 

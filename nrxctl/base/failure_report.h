@@ -3,6 +3,9 @@
 // A check reports and returns false; the caller returns, and its handles release what they own.
 #pragma once
 
+#include <cstdint>
+#include <string_view>
+
 #include "platform/return_code.h"
 
 namespace nrx {
@@ -25,6 +28,16 @@ struct source_location {
 // A null text, a line of 0 and a code of 0 are omitted.
 void report_failure(const char* label, const char* condition, const char* exit_label,
                     const char* message, const char* file, int line, platform::return_code code);
+
+// Prints a line of fixed text on standard output that says that something failed. Counts as a
+// failure although it is no report.
+void print_failure(std::string_view line);
+
+// Counts a failure that has no text of its own.
+void count_failure();
+
+// The number of failures of this process so far: reports, and what the functions above counted.
+std::uint64_t failure_count();
 
 // Reports a failed check of the subsystem with the given label unless the condition holds. Returns
 // the condition's value. The text of the condition is what a reader of the report expects, not C++.

@@ -36,6 +36,12 @@ constexpr number_parts split_number(std::string_view argument) {
     return {negative, hexadecimal, argument};
 }
 
+// Returns the value of an argument, or nullopt if parse_number would reject it.
+std::optional<std::int64_t> read_number(std::string_view argument);
+
+// Returns a number from 0 to max, or nullopt if the argument is none.
+std::optional<std::uint32_t> read_number_up_to(std::uint32_t max, std::string_view argument);
+
 // Returns the value of an argument: an optional sign, then "0x" and hexadecimal digits, or decimal
 // digits. The digits must fit signed 64 bits before the sign is applied. Anything else ends the
 // process with status 1 after "message (argument)" as a line on standard output.
@@ -45,6 +51,10 @@ std::int64_t parse_number(std::string_view argument, std::string_view message);
 inline std::uint32_t parse_low_32_bits(std::string_view argument, std::string_view message) {
     return static_cast<std::uint32_t>(parse_number(argument, message));
 }
+
+// Returns true if an argument is a number of 32 bits without a sign; otherwise explains that it is
+// not. For an argument of which only the low 32 bits count.
+bool is_32_bit_number(std::string_view argument);
 
 // Returns a number from 0 to max. Rejects any other argument as parse_number does.
 std::uint32_t parse_number_up_to(std::uint32_t max, std::string_view argument,

@@ -7,6 +7,7 @@
 
 #include "nrxctl/base/text_line.h"
 #include "nrxctl/base/utf8.h"
+#include "platform/interrupt.h"
 
 namespace nrx {
 
@@ -83,7 +84,9 @@ std::string escape_controls(std::string_view text) {
 }  // namespace
 
 bool descriptor_sink::write(std::string_view text) {
-    return note_result(write_all(descriptor_, text));
+    const bool written = write_all(descriptor_, text);
+    if (!written) reader_gone_ = errno == EPIPE || errno == ECONNRESET;
+    return note_result(written);
 }
 
 bool terminal_sink::write(std::string_view text) {
@@ -140,12 +143,15 @@ program_output::terminal_filter::terminal_filter(standard_stream stream)
 
 program_output::program_output() {
     std::signal(SIGPIPE, SIG_IGN);
+    std::signal(SIGXFSZ, SIG_IGN);
     if (::isatty(STDOUT_FILENO) != 0) output_.emplace(standard_stream::output);
     if (::isatty(STDERR_FILENO) != 0) error_.emplace(standard_stream::error);
 }
 
 bool write_output(std::string_view text) {
-    return output_sink->write(text);
+    const bool written = output_sink->write(text);
+    if (!written && output_sink->reader_gone()) platform::request_interrupt();
+    return written;
 }
 
 void print_line(std::string_view text) {
@@ -162,6 +168,11 @@ void write_error(std::string_view text) {
 
 void flush_output() {
     output_sink->flush();
+}
+
+bool output_lost() {
+    const auto lost = [](const line_sink& sink) { return sink.failed() && !sink.reader_gone(); };
+    return lost(*output_sink) || lost(*error_sink);
 }
 
 }  // namespace nrx

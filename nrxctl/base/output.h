@@ -4,7 +4,7 @@
 // stream's descriptor as soon as it is complete, in one write; a program or a test can install
 // another sink for a scope. Output that cannot be written (a full disk, a closed pipe) is dropped
 // and the tool continues, because what it does to the device must not depend on who reads its
-// output.
+// output. A reader that has gone away is an interrupt, which ends a watch.
 //
 // Sinks are installed and written by one thread.
 #pragma once
@@ -33,6 +33,9 @@ public:
     // Returns true if any text was lost so far.
     [[nodiscard]] bool failed() const { return failed_; }
 
+    // Returns true if text was lost because nobody reads it any more.
+    [[nodiscard]] virtual bool reader_gone() const { return false; }
+
 protected:
     // Remembers a failure. Returns written.
     bool note_result(bool written) {
@@ -49,9 +52,11 @@ class descriptor_sink final : public line_sink {
 public:
     constexpr explicit descriptor_sink(int descriptor) : descriptor_(descriptor) {}
     bool write(std::string_view text) override;
+    [[nodiscard]] bool reader_gone() const override { return reader_gone_; }
 
 private:
     int descriptor_;
+    bool reader_gone_ = false;
 };
 
 // Makes text from a device safe for a terminal: writes control characters (but tab and line feed)
@@ -62,6 +67,7 @@ public:
     explicit terminal_sink(line_sink& target) : target_(target) {}
     bool write(std::string_view text) override;
     bool flush() override { return note_result(target_.flush()); }
+    [[nodiscard]] bool reader_gone() const override { return target_.reader_gone(); }
 
 private:
     line_sink& target_;
@@ -79,6 +85,7 @@ public:
 
     bool write(std::string_view text) override;
     bool flush() override;
+    [[nodiscard]] bool reader_gone() const override { return target_.reader_gone(); }
 
 private:
     bool write_buffer();
@@ -129,8 +136,8 @@ private:
 };
 
 // Prepares the streams of a program: text to a terminal passes a terminal_sink, and writing to a
-// pipe that nobody reads fails instead of ending the process. A program creates one before it
-// writes anything.
+// pipe that nobody reads, or beyond the limit of a file's size, fails instead of ending the
+// process. A program creates one before it writes anything.
 class program_output {
 public:
     program_output();
@@ -150,7 +157,7 @@ private:
 };
 
 // Writes text, to which no line feed is added, on standard output. Returns false if it could not be
-// written.
+// written; a reader that has gone away is also an interrupt (see platform/interrupt.h).
 bool write_output(std::string_view text);
 
 // Writes text and a line feed on standard output.
@@ -162,5 +169,9 @@ void write_error(std::string_view text);
 
 // Writes buffered standard output. Call it before waiting for anything.
 void flush_output();
+
+// Returns true if the installed sink of either stream has lost text that somebody may have wanted:
+// it could not be written, and not because the reader has gone away.
+bool output_lost();
 
 }  // namespace nrx

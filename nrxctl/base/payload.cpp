@@ -3,10 +3,12 @@
 #include <array>
 #include <cstddef>
 #include <limits>
+#include <string>
 #include <string_view>
 
 #include "nrxctl/base/arguments.h"
 #include "nrxctl/base/end_process.h"
+#include "nrxctl/base/explanation.h"
 #include "nrxctl/base/little_endian.h"
 #include "nrxctl/base/numbers.h"
 #include "nrxctl/base/output.h"
@@ -38,6 +40,10 @@ std::int32_t parse_value(std::string_view argument) {
         if (value >= limits::min() && value <= limits::max())
             return static_cast<std::int32_t>(value);
     }
+    explain([&] {
+        return explanation{quoted(argument) + " is no value of 32 bits",
+                           "expected hexadecimal digits, or 0d and decimal ones"};
+    });
     reject_argument("payload value is invalid", argument);
 }
 
@@ -45,6 +51,10 @@ std::int32_t parse_value(std::string_view argument) {
 void check_width(std::int64_t value, std::uint64_t max_value) {
     const auto widened = static_cast<std::uint64_t>(value);
     if (widened <= max_value) return;
+    explain([&] {
+        return explanation{std::to_string(value) + " does not fit the width of the values",
+                           "u8, u16 or u32 before the first one sets it"};
+    });
     text_line line;
     line.text("Value ").number(value).text(" (0").hex(widened).text(") is bigger than allowed (");
     line.number(max_value).text(", 0x").hex(max_value).text(")");

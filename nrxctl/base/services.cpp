@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "nrxctl/base/check.h"
+#include "nrxctl/base/explanation.h"
 #include "nrxctl/base/numbers.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/text_line.h"
@@ -14,12 +15,10 @@ namespace nrx {
 
 namespace {
 
+constexpr std::string_view name_prefix = "WQR_";
+
 // The condition of a lookup, in failure reports.
 constexpr const char* service_is_not_null = "service != ((io_object_t) 0)";
-
-bool is_numeric(std::string_view service_name) {
-    return service_name.starts_with(hex_prefix) || all_digits(service_name);
-}
 
 std::optional<service_id> narrow_id(std::optional<std::int64_t> number) {
     using limits = std::numeric_limits<service_id>;
@@ -37,6 +36,21 @@ std::optional<service_id> parse_service_id(std::string_view name) {
 std::optional<service_id> read_service_id(const platform::service& service) {
     const auto id = platform::read_property(service, service_id_key);
     return id ? narrow_id(id->number()) : std::nullopt;
+}
+
+// The names of all interface services, as a user may give them.
+std::vector<std::string> service_names() {
+    std::vector<platform::service> services;
+    std::vector<std::string> names;
+    if (platform::all_matches(platform::matching_class(interface_class), services) !=
+        platform::success)
+        return names;
+    for (const platform::service& service : services) {
+        std::string name;
+        if (platform::entry_name(service, name) == platform::success)
+            names.emplace_back(without_prefix(name));
+    }
+    return names;
 }
 
 platform::return_code list_service(const platform::service& service) {
@@ -91,13 +105,30 @@ platform::dictionary match_usage_pairs(platform::array pairs) {
 }
 
 std::string prefixed_name(std::string_view name) {
-    constexpr std::string_view prefix = "WQR_";
     constexpr std::size_t max_length = 127;
-    return std::string(prefix).append(name.substr(0, max_length - prefix.size()));
+    return std::string(name_prefix).append(name.substr(0, max_length - name_prefix.size()));
+}
+
+std::string_view without_prefix(std::string_view registry_name) {
+    if (registry_name.starts_with(name_prefix)) registry_name.remove_prefix(name_prefix.size());
+    return registry_name;
+}
+
+bool is_service_id(std::string_view name) {
+    return name.starts_with(hex_prefix) || all_digits(name);
+}
+
+void explain_missing_service(std::string_view name) {
+    explain([&] {
+        const std::vector<std::string> names = service_names();
+        const std::vector<std::string_view> candidates(names.begin(), names.end());
+        return explanation{"no service " + quoted(name),
+                           "--list shows all" + suggestion(name, candidates)};
+    });
 }
 
 platform::service find_service(std::string_view name) {
-    if (is_numeric(name)) {
+    if (is_service_id(name)) {
         const auto id = parse_service_id(name);
         return id ? platform::first_match(match_service_id(*id)) : platform::service();
     }
@@ -109,16 +140,18 @@ platform::service find_service(std::string_view name) {
 
 bool service_exists(std::string_view name) {
     if (find_service(name)) return true;
-    print_line(text_line().text("Service ").text(name).text(" can't be found").view());
+    explain_missing_service(name);
+    print_failure(text_line().text("Service ").text(name).text(" can't be found").view());
     return false;
 }
 
 platform::service find_hid_device(std::string_view name) {
-    if (is_numeric(name)) {
+    if (is_service_id(name)) {
         const auto location = parse_service_id(name);
         return location ? platform::first_match(match_hid_device(*location)) : platform::service();
     }
     const platform::service nrx_interface = find_service(name);
+    if (!nrx_interface) explain_missing_service(name);
     if (!check(nrx_interface, "nrx_interface")) return {};
     const auto location = platform::read_property(nrx_interface, service_id_key);
     return location ? platform::first_match(match_hid_device(*location)) : platform::service();
@@ -126,10 +159,12 @@ platform::service find_hid_device(std::string_view name) {
 
 bool resolve_service_id(std::string_view name, service_id& id) {
     std::optional<service_id> resolved;
-    if (is_numeric(name)) {
+    if (is_service_id(name)) {
         resolved = parse_service_id(name);
+        if (!resolved) explain_missing_service(name);
     } else {
         const platform::service service = find_service(name);
+        if (!service) explain_missing_service(name);
         if (!check(service, service_is_not_null)) return false;
         resolved = read_service_id(service);
     }

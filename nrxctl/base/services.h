@@ -45,9 +45,18 @@ platform::dictionary match_usage_pairs(platform::array pairs);
 // service's own name, cut to 127 characters.
 std::string prefixed_name(std::string_view name);
 
+// Returns a registry name without that prefix.
+std::string_view without_prefix(std::string_view registry_name);
+
 // Returns the interface service with that name or id, or an empty handle. A registry name is tried
 // with the prefix "WQR_" first, then as given. Reports nothing.
 platform::service find_service(std::string_view name);
+
+// Explains that no interface service has that name or id, and which name is similar.
+void explain_missing_service(std::string_view name);
+
+// Returns true if a service name is an id.
+bool is_service_id(std::string_view name);
 
 // Returns true if find_service finds the service; otherwise prints a line on standard output that
 // says so.

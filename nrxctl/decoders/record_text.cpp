@@ -5,11 +5,18 @@
 #include <cstddef>
 
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/print_limit.h"
 #include "nrxctl/base/text_line.h"
 #include "nrxctl/base/utf8.h"
 #include "nrxctl/decoders/category_decoders.h"
 
 namespace nrx {
+
+namespace {
+
+std::uint64_t unprintable_records = 0;
+
+}  // namespace
 
 std::string_view decode_profile_record(const profile_record& record, event_text& line) {
     const profile_decoder* decoder = decoder_for_category(record.category());
@@ -26,7 +33,11 @@ std::optional<std::string_view> format_profile_record(const profile_record& reco
 
 void print_profile_record(const profile_record& record) {
     event_text line;
-    if (!format_profile_record(record, line)) return;
+    if (!format_profile_record(record, line)) {
+        ++unprintable_records;
+        return;
+    }
+    if (!count_printed_event()) return;
     line.append(1, [](char* target) {
         *target++ = '\n';
         return target;
@@ -51,7 +62,11 @@ void nrx_profile_hexdump(std::string_view label, platform::byte_view bytes, int 
 }
 
 void dump_profile_record(const profile_record& record) {
-    nrx_profile_hexdump("prof-event ", record.bytes, 0);
+    if (count_printed_event()) nrx_profile_hexdump("prof-event ", record.bytes, 0);
+}
+
+std::uint64_t unprintable_record_count() {
+    return unprintable_records;
 }
 
 record_printer select_record_printer(bool decode) {

@@ -1,6 +1,7 @@
 // Event records as lines of text: decoded, or in hexadecimal.
 #pragma once
 
+#include <cstdint>
 #include <optional>
 #include <string_view>
 
@@ -19,9 +20,12 @@ std::string_view decode_profile_record(const profile_record& record, event_text&
 std::optional<std::string_view> format_profile_record(const profile_record& record,
                                                       event_text& line);
 
-// Prints the text of a record as a line on standard output; nothing if it is not UTF-8. A
-// record_printer.
+// Prints the text of a record as a line on standard output. If it is not UTF-8, prints nothing and
+// counts the record. A record_printer.
 void print_profile_record(const profile_record& record);
+
+// The number of records that this process has not printed because their text is not UTF-8.
+std::uint64_t unprintable_record_count();
 
 // Writes a line on standard output: the label, then each byte as two lower-case hexadecimal digits,
 // each followed by a space if spaced is 1 (no other value). The label's length + 3 * the number of

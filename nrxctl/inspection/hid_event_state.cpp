@@ -3,6 +3,7 @@
 #include <sstream>
 
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/print_limit.h"
 
 namespace nrx {
 
@@ -24,7 +25,7 @@ std::ostream& event_stream() {
 }
 
 void end_event_line() {
-    print_line(line_stream().view());
+    if (count_printed_event()) print_line(line_stream().view());
     line_stream().str({});
 }
 

@@ -16,7 +16,8 @@ extern double last_wall_time;
 // that one of them sets applies to all that follow. The text is held until the line ends.
 std::ostream& event_stream();
 
-// Ends the line: writes it on standard output with one write.
+// Ends the line: writes it on standard output with one write, unless the watch has printed as many
+// as it may.
 void end_event_line();
 
 }  // namespace nrx

@@ -2,6 +2,7 @@
 
 #include "nrxctl/base/check.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/print_limit.h"
 #include "nrxctl/inspection/hid_events.h"
 #include "nrxctl/inspection/hid_statistics.h"
 #include "platform/hid_event_client.h"
@@ -10,6 +11,7 @@
 namespace nrx {
 
 platform::return_code watch_hid_events(std::optional<std::chrono::seconds> duration) {
+    const limited_watch limited;
     const platform::hid_event_client client = platform::create_hid_event_client();
     if (!check(client, "client")) return platform::not_found;
     platform::return_code kr = platform::set_event_callback(

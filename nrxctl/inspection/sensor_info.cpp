@@ -4,9 +4,11 @@
 #include <cstddef>
 #include <cstdint>
 
+#include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/name_table.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
+#include "nrxctl/base/services.h"
 #include "nrxctl/base/text_line.h"
 #include "nrxctl/inspection/client_table.h"
 #include "nrxctl/inspection/sensor_details.h"
@@ -232,8 +234,10 @@ constexpr std::int32_t detailed_level = 2;
 void print_read_failure(std::string_view service_name, platform::return_code kr) {
     text_line line;
     line.text("sensor ").text(service_name).text(" doesn't provide sensor info (kr=");
-    print_line(line.hex(static_cast<std::uint32_t>(kr)).text(")\n").view());
-    if (kr == platform::not_found) print_hid_services(service_name);
+    print_failure(line.hex(static_cast<std::uint32_t>(kr)).text(")\n").view());
+    if (kr != platform::not_found) return;
+    print_hid_services(service_name);
+    explain_missing_service(service_name);
 }
 
 void print_details(std::string_view service_name) {

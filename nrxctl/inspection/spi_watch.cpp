@@ -1,7 +1,10 @@
 #include "nrxctl/inspection/spi_watch.h"
 
+#include <string>
+
 #include "nrxctl/base/check.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/print_limit.h"
 #include "nrxctl/base/services.h"
 #include "nrxctl/base/text_line.h"
 #include "nrxctl/printers/spi_status.h"
@@ -30,6 +33,7 @@ bool check_result(platform::return_code code, const char* message,
 }
 
 void watch_records(const platform::hid_interface& device, service_id id, std::uint32_t mode) {
+    const limited_watch limited;
     constexpr const char* callback_failure = "Failed in adding callback";
     platform::return_code kr = platform::schedule_on_loop(device);
     if (!check_result(kr, callback_failure)) return;
@@ -52,6 +56,8 @@ void disable(const platform::hid_interface& device, service_id id) {
 platform::return_code watch_spi_status(service_id id, std::uint32_t mode) {
     print_line(text_line().text("Found an id for service = ").number(id).view());
     const platform::service service = platform::first_match(match_hid_device(id));
+    if (!service)
+        explain([&] { return explanation{"no HID device for service " + std::to_string(id), ""}; });
     if (!check_step(!!service, condition::service, "Service instance not found"))
         return platform::success;
     const platform::hid_plugin plugin = platform::create_hid_plugin(service);

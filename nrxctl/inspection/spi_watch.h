@@ -10,8 +10,9 @@ namespace nrx {
 
 // Sets the mode of the HID device that belongs to the interface service with that id. If the mode
 // is not 0, prints each SPI status record that the device sends, from the event loop of this
-// thread, until the loop is stopped. The mode stays set after that; call again with mode 0 to
-// switch it off. A step that fails is reported and ends the watch. Always returns success.
+// thread, until the loop is stopped; a watch of print_limit.h. The mode stays set after that; call
+// again with mode 0 to switch it off. A step that fails is reported and ends the watch. Always
+// returns success.
 platform::return_code watch_spi_status(service_id id, std::uint32_t mode);
 
 }  // namespace nrx

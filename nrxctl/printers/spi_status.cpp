@@ -9,6 +9,7 @@
 #include "nrxctl/base/hex_dump.h"
 #include "nrxctl/base/name_table.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/print_limit.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
 
@@ -69,11 +70,9 @@ void print_status(const reply_fields& fields) {
     print_line(line.view());
 }
 
-void print_captured(platform::byte_view record, std::uint8_t type) {
-    const std::string_view* heading = headings.find(type);
-    if (heading == nullptr) return;
+void print_captured(platform::byte_view record, std::string_view heading) {
     text_line line = begin_line(reply_fields(record));
-    print_line(line.text(*heading).text(": ").view());
+    print_line(line.text(heading).text(": ").view());
     hex_dump(record.subspan(header_size));
 }
 
@@ -83,9 +82,13 @@ void print_spi_status(platform::byte_view record) {
     if (record.empty()) return;
     const reply_fields fields(record);
     const std::uint8_t type = fields.u8(type_offset);
-    const bool is_status = record.size() >= header_size && type == status_type;
+    const bool is_complete_header = record.size() >= header_size;
+    const bool is_status = is_complete_header && type == status_type;
+    const std::string_view* heading = headings.find(type);
+    if (is_complete_header && !is_status && heading == nullptr) return;
+    if (!count_printed_event()) return;
     if (!check_length(record, is_status ? status_size : header_size)) return hex_dump(record);
-    is_status ? print_status(fields) : print_captured(record, type);
+    is_status ? print_status(fields) : print_captured(record, *heading);
 }
 
 }  // namespace nrx

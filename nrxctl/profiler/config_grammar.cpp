@@ -5,6 +5,7 @@
 #include <cstddef>
 
 #include "nrxctl/base/arguments.h"
+#include "nrxctl/base/explanation.h"
 #include "nrxctl/decoders/event_names.h"
 #include "nrxctl/profiler/profiler_config.h"
 
@@ -163,6 +164,10 @@ constexpr std::array profilers{
 };
 
 }  // namespace
+
+std::vector<std::string_view> profiler_keywords() {
+    return keywords_of(profilers);
+}
 
 const profiler_grammar* find_profiler_grammar(std::string_view keyword) {
     return find_keyword(profilers, keyword);

@@ -4,6 +4,7 @@
 #include <cstdint>
 #include <span>
 #include <string_view>
+#include <vector>
 
 namespace nrx {
 
@@ -34,6 +35,9 @@ struct profiler_grammar {
     const report_grammar* reports = nullptr;  // null: reports and services are ignored
     std::span<const component_reports> special_reports = {};
 };
+
+// The keywords of all profilers.
+std::vector<std::string_view> profiler_keywords();
 
 // Returns the grammar of a profiler, or null if no profiler has that keyword.
 const profiler_grammar* find_profiler_grammar(std::string_view keyword);

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <limits>
 #include <span>
+#include <string>
 
 #include "nrxctl/base/arguments.h"
 #include "nrxctl/base/check.h"
@@ -26,21 +27,39 @@ field_list list_in_field(const field_list& fields, std::size_t index) {
     return index < fields.size() ? split(fields[index], ',') : field_list{all_keyword};
 }
 
+std::uint32_t parse_report(std::span<const keyword_row> keywords, std::string_view report) {
+    const keyword_row* row = find_keyword(keywords, report);
+    if (row != nullptr) return row->number;
+    const explanation_scope scope([&](explanation& given) {
+        given = unknown_keyword("report", report, "expected a mask or", keywords_of(keywords));
+    });
+    return parse_u32(report, "report mask is invalid");
+}
+
 std::uint32_t parse_reports(std::span<const keyword_row> keywords, const field_list& reports) {
     std::uint32_t mask = 0;
     for (const std::string_view report : reports) {
-        if (report == stop_keyword) continue;
-        const keyword_row* row = find_keyword(keywords, report);
-        mask |= row == nullptr ? parse_u32(report, "report mask is invalid") : row->number;
+        if (report != stop_keyword) mask |= parse_report(keywords, report);
     }
     return mask;
+}
+
+explanation unknown_component(const profiler_grammar& profiler, std::string_view component) {
+    const std::string_view numbers = profiler.takes_numeric_components ? " a number or" : "";
+    return unknown_keyword("component", component,
+                           std::string(profiler.keyword).append(" has").append(numbers),
+                           keywords_of(profiler.components));
 }
 
 bool parse_services(const field_list& services, profiler_config& config) {
     std::size_t service_i = 0;
     for (const std::string_view service : services) {
-        if (!check(service_i < config.services.size(),
-                   "service_i < (sizeof(config.services) / sizeof(config.services[0]))")) {
+        if (!check_explained(
+                service_i < config.services.size(),
+                "service_i < (sizeof(config.services) / sizeof(config.services[0]))", [&] {
+                    return explanation{"too many services",
+                                       "expected at most " + std::to_string(service_i)};
+                })) {
             return false;
         }
         config.services[service_i++] = service_code(service);
@@ -95,21 +114,41 @@ bool init_profiler_config(const profiler_grammar& profiler, std::string_view com
     }
     const keyword_row* row = find_keyword(profiler.components, component);
     const bool enable_num_components = profiler.takes_numeric_components;
-    if (row == nullptr && !check(enable_num_components, "enable_num_components")) return false;
+    const auto describe = [&] { return unknown_component(profiler, component); };
+    if (row == nullptr &&
+        !check_explained(enable_num_components, "enable_num_components", describe)) {
+        return false;
+    }
+    const explanation_scope scope([&](explanation& given) { given = describe(); });
     config.component = row == nullptr ? parse_u32(component, "component is invalid") : row->number;
     if (first_report == stop_keyword) config.state = profiler_state::disable;
     return true;
 }
 
 bool parse_profiler_config(std::string_view argument, std::vector<profiler_config>& configs) {
+    const explanation_scope scope(
+        [&](explanation& given) { given.problem += " in " + quoted(argument); });
     const field_list fields = split(argument, ':');
-    if (fields.size() < 2 || fields.size() > 4) return false;
+    if (fields.size() < 2 || fields.size() > 4) {
+        explain([] {
+            return explanation{"wrong number of fields",
+                               "expected PROFILER:COMPONENTS[:REPORTS[:SERVICES]]"};
+        });
+        return false;
+    }
     const profiler_grammar* profiler = find_profiler_grammar(fields[0]);
-    if (!check(profiler, condition::never)) return false;
+    if (!check_explained(profiler, condition::never, [&] {
+            return unknown_keyword("profiler", fields[0], "expected", profiler_keywords());
+        })) {
+        return false;
+    }
     config_fields lists{*profiler, split(fields[1], ','), list_in_field(fields, 2),
                         list_in_field(fields, 3)};
     if (profiler->takes_one_component_only &&
-        !check(lists.components.size() == 1, "components.size() == 1")) {
+        !check_explained(lists.components.size() == 1, "components.size() == 1", [&] {
+            return explanation{"not one component",
+                               "each of " + quoted(fields[0]) + " needs an argument of its own"};
+        })) {
         return false;
     }
     replace_all(*profiler, lists.components);

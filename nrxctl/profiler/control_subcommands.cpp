@@ -1,4 +1,5 @@
 #include <array>
+#include <optional>
 #include <string_view>
 #include <vector>
 
@@ -37,6 +38,38 @@ constexpr std::array error_action_rows{
     error_action_row{"nothing", error_action::nothing},
 };
 
+// Reads the argument of "on-error". A missing one is invalid, too.
+const error_action_row* read_error_action(argument_cursor& arguments) {
+    const std::string_view argument = arguments.next().value_or("");
+    const error_action_row* row = find_keyword(error_action_rows, argument);
+    if (row != nullptr) return row;
+    print_failure(text_line().text("invalid argument: ").text(argument).view());
+    explain([&] {
+        return unknown_keyword("action", argument, "expected", keywords_of(error_action_rows));
+    });
+    return nullptr;
+}
+
+bool read_configs(argument_cursor& arguments, std::vector<profiler_config>& configs) {
+    const bool success = parse_profiler_configs(arguments, configs);
+    return check(success, condition::success);
+}
+
+// The arguments of a profiling run.
+struct run_args {
+    monitor_args monitor;
+    std::vector<profiler_config> configs;
+};
+
+std::optional<run_args> read_run_args(argument_cursor& arguments) {
+    run_args args{parse_monitor_args(arguments), {}};
+    const bool human_is_late = arguments.peek(0) == human_keyword;
+    const explanation_scope scope([=](explanation& given) {
+        if (human_is_late) given = {"human must stand before the duration", ""};
+    });
+    return read_configs(arguments, args.configs) ? std::optional(args) : std::nullopt;
+}
+
 }  // namespace
 
 void enable(argument_cursor& /*arguments*/) {
@@ -57,24 +90,18 @@ void flush(argument_cursor& /*arguments*/) {
     check_success(kr, condition::kr_is_zero);
 }
 
-// A missing argument is invalid, too.
 void set_action_on_error(argument_cursor& arguments) {
-    const std::string_view argument = arguments.next().value_or("");
-    const error_action_row* row = find_keyword(error_action_rows, argument);
-    if (row == nullptr) {
-        print_line(text_line().text("invalid argument: ").text(argument).view());
-        return;
-    }
+    const error_action_row* row = read_error_action(arguments);
+    if (row == nullptr) return;
     const platform::return_code kr = set_error_action(row->action);
     check_success(kr, condition::kr_is_zero);
 }
 
 void configure(argument_cursor& arguments) {
     std::vector<profiler_config> configs;
-    bool success = parse_profiler_configs(arguments, configs);
-    if (!check(success, condition::success)) return;
+    if (!read_configs(arguments, configs)) return;
     print_configs(configs);
-    success = apply_profiler_configs(configs);
+    const bool success = apply_profiler_configs(configs);
     check(success, condition::success);
 }
 
@@ -102,20 +129,40 @@ void monitor(argument_cursor& arguments) {
 }
 
 void run_profile(argument_cursor& arguments) {
-    const monitor_args args = parse_monitor_args(arguments);
-    std::vector<profiler_config> configs;
-    bool success = parse_profiler_configs(arguments, configs);
-    if (!check(success, condition::success)) return;
-    success = apply_profiler_configs(configs);
+    auto args = read_run_args(arguments);
+    if (!args) return;
+    bool success = apply_profiler_configs(args->configs);
     if (!check(success, condition::success)) return;
     success = set_profiler_enabled(true);
     if (!check(success, condition::success)) return;
-    success = monitor_profiler(args.duration, select_record_printer(args.human));
+    success = monitor_profiler(args->monitor.duration, select_record_printer(args->monitor.human));
     if (!check(success, condition::success)) return;
-    for (profiler_config& config : configs)
+    for (profiler_config& config : args->configs)
         config.state = profiler_state::disable;
-    apply_profiler_configs(configs);
+    apply_profiler_configs(args->configs);
     set_profiler_enabled(false);
+}
+
+arguments_check check_error_action(argument_cursor& arguments) {
+    return checked(read_error_action(arguments) != nullptr);
+}
+
+arguments_check check_configs(argument_cursor& arguments) {
+    if (arguments.remaining() == 0) {
+        explain([] { return explanation{"a configuration is needed, such as sensor:accel", ""}; });
+        return arguments_check::misused;
+    }
+    std::vector<profiler_config> configs;
+    return checked(read_configs(arguments, configs));
+}
+
+arguments_check check_monitor(argument_cursor& arguments) {
+    parse_monitor_args(arguments);
+    return arguments_check::accepted;
+}
+
+arguments_check check_run(argument_cursor& arguments) {
+    return checked(read_run_args(arguments).has_value());
 }
 
 }  // namespace nrx::profile

@@ -31,12 +31,18 @@ constexpr std::array log_option_rows{
     log_option_row{"human", &log_options::human},
 };
 
-// Returns nullopt if an argument is unknown.
+// Returns nullopt with a failure report if an argument is unknown.
 std::optional<log_options> parse_log_options(argument_cursor& arguments) {
     log_options options;
     while (const auto argument = arguments.next()) {
         const log_option_row* row = find_keyword(log_option_rows, *argument);
-        if (row == nullptr) return std::nullopt;
+        if (row == nullptr) print_line("Invalid parameter");
+        if (!check_explained(row, condition::never, [&] {
+                return unknown_keyword("argument", *argument, "expected",
+                                       keywords_of(log_option_rows));
+            })) {
+            return std::nullopt;
+        }
         options.*(row->option) = true;
     }
     return options;
@@ -50,11 +56,7 @@ void signal_error_dump(argument_cursor& /*arguments*/) {
 
 void show_logs(argument_cursor& arguments) {
     const auto options = parse_log_options(arguments);
-    if (!options) {
-        print_line("Invalid parameter");
-        check(false, condition::never);
-        return;
-    }
+    if (!options) return;
     const record_printer print = select_record_printer(options->human);
     if (options->firmware || !options->errors) {
         read_profile_records(print);
@@ -66,6 +68,10 @@ void show_logs(argument_cursor& arguments) {
         read_profiler_log(print, record_store::error_dump);
         print_line("\n");
     }
+}
+
+arguments_check check_log_options(argument_cursor& arguments) {
+    return checked(parse_log_options(arguments).has_value());
 }
 
 }  // namespace nrx::profile

@@ -2,11 +2,14 @@
 
 #include <chrono>
 #include <limits>
+#include <string>
 
 #include "nrxctl/base/check.h"
 #include "nrxctl/base/clock_references.h"
+#include "nrxctl/base/explanation.h"
 #include "nrxctl/base/numbers.h"
 #include "nrxctl/base/output.h"
+#include "nrxctl/base/print_limit.h"
 #include "nrxctl/base/profile_record.h"
 #include "nrxctl/base/reply_fields.h"
 #include "nrxctl/base/text_line.h"
@@ -77,6 +80,10 @@ void print_remaining(const profiler_conn& conn, record_printer print) {
 
 std::uint32_t parse_duration(std::string_view argument) {
     if (argument == "auto") return 0;
+    const explanation_scope scope([&](explanation& given) {
+        given = {quoted(argument) + " is no duration",
+                 "expected auto, or milliseconds from 0 to " + std::to_string(max_milliseconds)};
+    });
     return parse_number_up_to(max_milliseconds, argument, "duration parameter is invalid") *
            microseconds_per_millisecond;
 }
@@ -84,7 +91,7 @@ std::uint32_t parse_duration(std::string_view argument) {
 monitor_args parse_monitor_args(argument_cursor& arguments) {
     monitor_args args;
     auto argument = arguments.next();
-    args.human = argument == "human";
+    args.human = argument == human_keyword;
     if (args.human) argument = arguments.next();
     if (argument) args.duration = parse_duration(*argument);
     print_args(args);
@@ -92,6 +99,7 @@ monitor_args parse_monitor_args(argument_cursor& arguments) {
 }
 
 bool monitor_profiler(std::uint32_t duration, record_printer print) {
+    const limited_watch limited;
     profiler_conn conn;
     const std::uint64_t start = platform::ticks();
     const bool has_fw_profiler = fw_profiler_available();

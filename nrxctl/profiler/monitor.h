@@ -16,6 +16,9 @@ struct monitor_args {
     bool human = false;          // records are printed as text
 };
 
+// The argument that asks for records as text.
+inline constexpr std::string_view human_keyword = "human";
+
 // Returns the duration in microseconds that an argument gives: 0 for "auto", otherwise a number of
 // milliseconds. Any other argument, and a duration beyond 32 bits, ends the process with status 1
 // after a message on standard output.
@@ -28,8 +31,8 @@ monitor_args parse_monitor_args(argument_cursor& arguments);
 // Prints the events in the driver's queue until the end marker or until the first events after the
 // duration (microseconds; 0: none). The duration is also sent to the coprocessor; here it is
 // measured with tick_period, which the front end sets. Then prints the events of another 100 ms,
-// the coprocessor's log, and "done". Returns false with a failure report if the monitor cannot
-// start or the queue fails.
+// the coprocessor's log, and "done". All events together are a watch of print_limit.h. Returns
+// false with a failure report if the monitor cannot start or the queue fails.
 bool monitor_profiler(std::uint32_t duration, record_printer print);
 
 // Prints the entries of the queue, up to the end marker, which sets ended and is not printed. An

@@ -2,9 +2,11 @@
 
 #include <array>
 
-#include "nrxctl/base/arguments.h"
+#include "nrxctl/base/explanation.h"
+#include "nrxctl/base/numbers.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/profiler/kernel_profiler.h"
+#include "nrxctl/profiler/monitor.h"
 #include "nrxctl/profiler/subcommands.h"
 
 namespace nrx {
@@ -30,6 +32,8 @@ void help(argument_cursor& /*arguments*/) {
         print_line(line);
 }
 
+constexpr auto any_number = subcommand_row::any_number;
+
 constexpr std::array subcommands{
     subcommand_row{"help", help},
     subcommand_row{"clear-eventsources", profile::clear_event_source_statistics},
@@ -40,14 +44,19 @@ constexpr std::array subcommands{
     subcommand_row{"disable", profile::disable},
     subcommand_row{"stop", profile::stop},
     subcommand_row{"flush", profile::flush},
-    subcommand_row{"config", profile::configure},
-    subcommand_row{"set-config", profile::configure},
+    subcommand_row{"config", profile::configure, any_number, profile::check_configs},
+    subcommand_row{"set-config", profile::configure, any_number, profile::check_configs},
     subcommand_row{"get-config", profile::show_configs},
-    subcommand_row{"monitor", profile::monitor},
+    subcommand_row{"monitor", profile::monitor, 2, profile::check_monitor},
     subcommand_row{"signal-errdump", profile::signal_error_dump},
-    subcommand_row{"get-logs", profile::show_logs},
-    subcommand_row{"on-error", profile::set_action_on_error},
+    subcommand_row{"get-logs", profile::show_logs, any_number, profile::check_log_options},
+    subcommand_row{"on-error", profile::set_action_on_error, 1, profile::check_error_action},
 };
+
+// An argument that begins a profiling run.
+bool begins_run(std::string_view argument) {
+    return argument == human_keyword || argument == "auto" || read_number(argument);
+}
 
 }  // namespace
 
@@ -57,6 +66,24 @@ void profile_command(std::string_view subcommand, std::span<char* const> argumen
     if (run_subcommand(subcommands, subcommand, cursor)) return;
     cursor.prepend(subcommand);
     profile::run_profile(cursor);
+}
+
+std::span<const subcommand_row> profile_subcommands() {
+    return subcommands;
+}
+
+arguments_check check_profile_command(std::string_view subcommand, std::span<char* const> arguments,
+                                      int& index) {
+    argument_cursor cursor(arguments, index);
+    if (const subcommand_row* row = find_keyword(subcommands, subcommand))
+        return check_subcommand(*row, cursor);
+    cursor.prepend(subcommand);
+    if (begins_run(subcommand)) return profile::check_run(cursor);
+    const explanation_scope scope([&](explanation& given) {
+        given = unknown_keyword("subcommand", subcommand, "expected a duration or",
+                                keywords_of(subcommands));
+    });
+    return profile::check_run(cursor);
 }
 
 }  // namespace nrx

@@ -4,6 +4,8 @@
 #include <span>
 #include <string_view>
 
+#include "nrxctl/base/arguments.h"
+
 namespace nrx {
 
 // Runs a subcommand. Its arguments are those of the command line from index on, the option parser's
@@ -14,5 +16,13 @@ namespace nrx {
 // the process with status 1. While the command runs, an interrupt asks the driver to end the stream
 // of events. Set tick_period first: without it a duration never expires.
 void profile_command(std::string_view subcommand, std::span<char* const> arguments, int& index);
+
+// The subcommands.
+std::span<const subcommand_row> profile_subcommands();
+
+// Reads the arguments as profile_command does, with the same messages, but does nothing else. More
+// arguments than the subcommand takes are misused.
+arguments_check check_profile_command(std::string_view subcommand, std::span<char* const> arguments,
+                                      int& index);
 
 }  // namespace nrx

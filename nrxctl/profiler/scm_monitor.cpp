@@ -1,6 +1,7 @@
 #include "nrxctl/profiler/scm_monitor.h"
 
 #include <array>
+#include <optional>
 #include <vector>
 
 #include "nrxctl/base/arguments.h"
@@ -29,24 +30,39 @@ void monitor_transfers(std::uint32_t duration, std::span<const profiler_config> 
     check(success, condition::success);
 }
 
+struct scm_args {
+    std::uint32_t duration;
+    std::vector<profiler_config> configs;
+};
+
+// Returns nullopt with a failure report if there is no valid configuration.
+std::optional<scm_args> read_scm_args(std::string_view duration, argument_cursor& arguments) {
+    scm_args args{parse_duration(duration), {}};
+    const bool success = parse_profiler_configs(arguments, args.configs);
+    if (!check(success, condition::success)) return std::nullopt;
+    if (!check_explained(!args.configs.empty(), "configs.size() != 0", [] {
+            return explanation{"no configuration", "expected one, such as scm:smb0"};
+        })) {
+        return std::nullopt;
+    }
+    return args;
+}
+
 // Returns true if the profiler was enabled and must be disabled again. Interrupts are handled until
 // this function returns.
-bool run_monitor(std::string_view duration_argument, argument_cursor& arguments) {
+bool run_monitor(std::string_view duration, argument_cursor& arguments) {
     const scoped_interrupt_handler interrupt_handler;
     if (!fw_profiler_available()) {
-        print_line("wqr fw profiler is not available");
+        print_failure("wqr fw profiler is not available");
         return false;
     }
     bool connected = false;
-    bool success = get_profiler_status(connected);
+    const bool success = get_profiler_status(connected);
     if (!check(success, condition::success)) return false;
-    const std::uint32_t duration = parse_duration(duration_argument);
-    std::vector<profiler_config> configs;
-    success = parse_profiler_configs(arguments, configs);
-    if (!check(success, condition::success)) return false;
-    if (!check(!configs.empty(), "configs.size() != 0")) return false;
+    const auto args = read_scm_args(duration, arguments);
+    if (!args) return false;
     if (!connected) set_profiler_enabled(true);
-    monitor_transfers(duration, configs);
+    monitor_transfers(args->duration, args->configs);
     return !connected;
 }
 
@@ -55,6 +71,12 @@ bool run_monitor(std::string_view duration_argument, argument_cursor& arguments)
 void scm_monitor(std::string_view duration, std::span<char* const> arguments, int& index) {
     argument_cursor cursor(arguments, index);
     if (run_monitor(duration, cursor)) set_profiler_enabled(false);
+}
+
+arguments_check check_scm_monitor(std::string_view duration, std::span<char* const> arguments,
+                                  int& index) {
+    argument_cursor cursor(arguments, index);
+    return checked(read_scm_args(duration, cursor).has_value());
 }
 
 }  // namespace nrx

@@ -4,6 +4,8 @@
 #include <span>
 #include <string_view>
 
+#include "nrxctl/base/arguments.h"
+
 namespace nrx {
 
 // Configures the coprocessor's half of the profiler as the arguments from index on say, prints the
@@ -15,5 +17,9 @@ namespace nrx {
 // While the monitor runs, an interrupt asks the driver to end the stream of events. Set tick_period
 // first: without it a duration never expires.
 void scm_monitor(std::string_view duration, std::span<char* const> arguments, int& index);
+
+// Reads the same arguments with the same messages, but does nothing else.
+arguments_check check_scm_monitor(std::string_view duration, std::span<char* const> arguments,
+                                  int& index);
 
 }  // namespace nrx

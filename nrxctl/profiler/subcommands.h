@@ -1,5 +1,5 @@
 // The subcommands of the profiler command family. Each reads its own arguments and reports its own
-// failures.
+// failures. A check reads the same arguments with the same messages, and does nothing else.
 #pragma once
 
 #include "nrxctl/base/arguments.h"
@@ -19,9 +19,15 @@ void monitor(argument_cursor& arguments);
 // A complete profiling run: configures, enables, monitors, and disables again.
 void run_profile(argument_cursor& arguments);
 
+arguments_check check_error_action(argument_cursor& arguments);
+arguments_check check_configs(argument_cursor& arguments);
+arguments_check check_monitor(argument_cursor& arguments);
+arguments_check check_run(argument_cursor& arguments);
+
 // log_subcommands.cpp
 void signal_error_dump(argument_cursor& arguments);
 void show_logs(argument_cursor& arguments);
+arguments_check check_log_options(argument_cursor& arguments);
 
 // statistics_subcommands.cpp
 void clear_event_source_statistics(argument_cursor& arguments);

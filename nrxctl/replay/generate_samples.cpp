@@ -3,6 +3,7 @@
 #include <string>
 
 #include "nrxctl/base/check.h"
+#include "nrxctl/base/explanation.h"
 #include "nrxctl/base/numbers.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/text_line.h"
@@ -24,11 +25,26 @@ bool is_frequency(std::string_view argument) {
 std::optional<std::uint32_t> samples_per_period(std::string_view argument, std::uint32_t interval) {
     argument.remove_suffix(unit_length);
     const std::uint32_t hz = parse_low_32_bits(argument, "invalid frequency");
-    if (!check(hz, "hz")) return std::nullopt;
+    if (!check_explained(hz, "hz", [] {
+            return explanation{"the frequency is 0", "expected at least 1hz"};
+        })) {
+        return std::nullopt;
+    }
     const std::uint32_t product = hz * interval;
     const std::uint32_t num_samples = product == 0 ? 0 : microseconds_per_second / product;
-    if (!check(num_samples, "num_samples")) return std::nullopt;
+    if (!check_explained(num_samples, "num_samples", [] {
+            return explanation{"a period contains no sample",
+                               "expected a shorter interval or a lower frequency"};
+        })) {
+        return std::nullopt;
+    }
     return num_samples;
+}
+
+explanation unknown_signal(const VirtualEvent& event, std::string_view signal_type) {
+    const auto keywords = event.signal_types();
+    if (!keywords.empty()) return unknown_keyword("signal", signal_type, "expected", keywords);
+    return {event.name() + " generates no signals", "accel, gyro and compass do"};
 }
 
 // All sample lines leave here. Returns false if the line could not be written.
@@ -39,7 +55,11 @@ bool write_sample(std::string line) {
 }  // namespace
 
 std::optional<signal_request> read_signal_request(argument_cursor& arguments) {
-    if (!check(arguments.remaining() >= 4, "argc >= optind+4")) return std::nullopt;
+    if (!check_explained(arguments.remaining() >= 4, "argc >= optind+4", [] {
+            return explanation{"generate needs SERVICE SIGNAL INTERVAL COUNT|FREQUENCYhz", ""};
+        })) {
+        return std::nullopt;
+    }
     signal_request request{};
     request.service = *arguments.next();
     request.signal_type = *arguments.next();
@@ -55,16 +75,30 @@ std::optional<signal_request> read_signal_request(argument_cursor& arguments) {
     return request;
 }
 
-void generate_samples(const signal_request& request) {
-    const event_ptr event = make_event(request.service);
+namespace {
+
+// Returns a generator of the requested signal, or null after a message if there is none.
+event_ptr make_generator(const signal_request& request) {
+    event_ptr event = make_event(request.service);
     if (!event) {
-        print_line(text_line().text("invalid service ").text(request.service).view());
-        return;
+        print_failure(text_line().text("invalid service ").text(request.service).view());
+        explain(
+            [&] { return unknown_keyword("service", request.service, "expected", event_tags()); });
+        return nullptr;
     }
     if (!event->init_generator(request.signal_type)) {
-        print_line(text_line().text("invalid generator ").text(request.signal_type).view());
-        return;
+        print_failure(text_line().text("invalid generator ").text(request.signal_type).view());
+        explain([&] { return unknown_signal(*event, request.signal_type); });
+        return nullptr;
     }
+    return event;
+}
+
+}  // namespace
+
+void generate_samples(const signal_request& request) {
+    const event_ptr event = make_generator(request);
+    if (!event) return;
     const block_output blocks;
     for (std::uint32_t i = 0; i < request.samples; ++i) {
         if (!write_sample(event->generate(request.signal_type, request.interval, request.samples)))
@@ -72,8 +106,22 @@ void generate_samples(const signal_request& request) {
     }
 }
 
-void replay::generate(argument_cursor& arguments) {
+namespace replay {
+
+void generate(argument_cursor& arguments) {
     if (const auto request = read_signal_request(arguments)) generate_samples(*request);
 }
+
+arguments_check check_generate(argument_cursor& arguments) {
+    const auto interval = arguments.peek(2);
+    auto count = arguments.peek(3);
+    const auto request = read_signal_request(arguments);
+    if (!request || !make_generator(*request)) return arguments_check::refused;
+    if (is_frequency(*count)) count->remove_suffix(unit_length);
+    const bool fits = is_32_bit_number(*interval) && is_32_bit_number(*count);
+    return fits ? arguments_check::accepted : arguments_check::misused;
+}
+
+}  // namespace replay
 
 }  // namespace nrx

@@ -35,6 +35,10 @@ namespace replay {
 // The subcommand. Reads its own arguments and reports its own failures.
 void generate(argument_cursor& arguments);
 
+// Reads the same arguments with the same messages, and does nothing else. A number that is not one
+// of 32 bits is misused.
+arguments_check check_generate(argument_cursor& arguments);
+
 }  // namespace replay
 
 }  // namespace nrx

@@ -1,5 +1,6 @@
 #include "nrxctl/replay/line_reader.h"
 
+#include <cerrno>
 #include <cstring>
 #include <sys/stat.h>
 
@@ -9,6 +10,7 @@ namespace nrx {
 
 line_reader::line_reader(const std::string& path, std::size_t capacity)
     : file_(std::fopen(path.c_str(), "rbe"), std::fclose), buffer_(capacity) {
+    if (!file_) error_ = errno;
     // The stream needs no buffer of its own.
     if (file_) std::setvbuf(file_.get(), nullptr, _IONBF, 0);
 }
@@ -21,6 +23,11 @@ std::size_t line_reader::file_size() const {
     struct stat status {};
     if (!file_ || ::fstat(::fileno(file_.get()), &status) != 0) return 0;
     return static_cast<std::size_t>(status.st_size);
+}
+
+std::string_view line_reader::beginning() {
+    if (end_ == 0) read_more();
+    return buffered();
 }
 
 std::optional<std::string_view> line_reader::next() {
@@ -57,6 +64,7 @@ bool line_reader::read_more() {
     flush_output();  // the file may be a pipe
     const std::size_t count =
         std::fread(buffer_.data() + end_, 1, buffer_.size() - end_, file_.get());
+    if (!good()) error_ = errno;
     end_ += count;
     return count > 0;
 }

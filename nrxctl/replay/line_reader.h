@@ -22,8 +22,15 @@ public:
     // Returns true if the file is open and every read has succeeded so far.
     [[nodiscard]] bool good() const;
 
+    // Why it is not good: the code of the operating system.
+    [[nodiscard]] int error() const { return error_; }
+
     // Returns the size of the file in bytes, or 0 if it is unknown before the file is read.
     [[nodiscard]] std::size_t file_size() const;
+
+    // The beginning of the file, at most a buffer of it, valid until the next call of next(). Call
+    // it before the first line is read.
+    std::string_view beginning();
 
     // Returns the next line without its line feed, valid until the next call. Returns nullopt at
     // the end of what can be read. The last line needs no line feed.
@@ -43,6 +50,7 @@ private:
     std::string_view extract_until(std::size_t line_end);
 
     std::unique_ptr<std::FILE, int (*)(std::FILE*)> file_;
+    int error_ = 0;
     std::vector<char> buffer_;
     // Positions in the buffer.
     std::size_t begin_ = 0;    // of the first byte not consumed

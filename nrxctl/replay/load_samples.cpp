@@ -30,9 +30,9 @@ platform::return_code call_app(const service_conn& conn, std::uint32_t method,
     return platform::call(conn.connection(), method, {{}, request}, no_outputs);
 }
 
-// Prints "Service NAME" and then the message, which begins with a space.
+// Prints "Service NAME" and then the message, which begins with a space and says what failed.
 void print_service_message(std::string_view service, std::string_view message) {
-    print_line(text_line().text("Service ").text(service).text(message).view());
+    print_failure(text_line().text("Service ").text(service).text(message).view());
 }
 
 // Arguments of load, and what they mean in the header.
@@ -55,27 +55,54 @@ constexpr std::array locations{
 };
 
 // Stores the value of an argument; leaves the default if there is no argument. Returns false after
-// "message: argument" as a line if the argument is unknown.
+// "Invalid <kind>: argument" as a line if the argument is unknown.
 bool read_keyword(std::optional<std::string_view> argument, std::span<const keyword_value> table,
-                  std::string_view message, std::uint32_t& value) {
+                  std::string_view kind, std::uint32_t& value) {
     if (!argument) return true;
     const keyword_value* row = find_keyword(table, *argument);
     if (row == nullptr) {
-        print_line(text_line().text(message).text(": ").text(*argument).view());
+        print_failure(text_line().text("Invalid ").text(kind).text(": ").text(*argument).view());
+        explain([&] { return unknown_keyword(kind, *argument, "expected", keywords_of(table)); });
         return false;
     }
     value = row->value;
     return true;
 }
 
-bool read_load_arguments(argument_cursor& arguments, replay_load_header& header) {
+struct load_args {
+    std::string path;
+    replay_load_header header{};
+};
+
+// Returns nullopt after a message or a failure report if the file is missing or an argument is
+// unknown.
+std::optional<load_args> read_load_args(argument_cursor& arguments) {
+    const auto path = arguments.next();
+    if (!check_explained(path, condition::arguments_remain, [] {
+            return explanation{"load needs a sample file", ""};
+        })) {
+        return std::nullopt;
+    }
+    load_args args{std::string(*path)};
     auto argument = arguments.next();
     if (argument == "filter") {
-        header.filter = 1;
+        args.header.filter = 1;
         argument = arguments.next();
     }
-    return read_keyword(argument, completions, "Invalid completion", header.completion) &&
-           read_keyword(arguments.next(), locations, "Invalid location", header.location);
+    if (!read_keyword(argument, completions, "completion", args.header.completion) ||
+        !read_keyword(arguments.next(), locations, "location", args.header.location)) {
+        return std::nullopt;
+    }
+    return args;
+}
+
+// Returns the service that the next argument names, or nullopt with a failure report.
+std::optional<std::string_view> read_first_service(argument_cursor& arguments) {
+    const auto service = arguments.next();
+    check_explained(service, condition::arguments_remain, [] {
+        return explanation{"unload needs a service", ""};
+    });
+    return service;
 }
 
 // How a step of a load ended. A rejected step has printed a message; it is not a failed check.
@@ -131,6 +158,7 @@ step_result load_file(const std::string& path, const replay_load_header& header)
     const auto groups = read_sample_file(path);
     const bool success = groups.has_value();
     if (!check(success, condition::success)) return step_result::failed;
+    if (groups->empty()) count_failure();
     step_result state = step_result::success;
     for (auto group = groups->begin(); group != groups->end() && state == step_result::success;
          ++group)
@@ -157,23 +185,31 @@ void unload_service(const service_conn& conn, std::string_view service) {
 
 void load(argument_cursor& arguments) {
     if (!is_enabled()) return;
-    const auto path = arguments.next();
-    if (!check(path, condition::arguments_remain)) return;
-    replay_load_header header{};
-    if (!read_load_arguments(arguments, header)) return;
-    const bool success = load_file(std::string(*path), header) != step_result::failed;
+    const auto args = read_load_args(arguments);
+    if (!args) return;
+    const bool success = load_file(args->path, args->header) != step_result::failed;
     check(success, condition::success);
 }
 
 void unload(argument_cursor& arguments) {
-    auto service = arguments.next();
-    if (!check(service, condition::arguments_remain)) return;
-    if (!is_enabled()) return;
+    auto service = read_first_service(arguments);
+    if (!service || !is_enabled()) return;
     service_conn conn(replay_app_name);
     const bool success = conn.open();
     if (!check(success, condition::success)) return;
     for (; service; service = arguments.next())
         unload_service(conn, *service);
+}
+
+arguments_check check_load(argument_cursor& arguments) {
+    return checked(read_load_args(arguments).has_value());
+}
+
+arguments_check check_unload(argument_cursor& arguments) {
+    const bool valid = read_first_service(arguments).has_value();
+    while (arguments.next()) {
+    }
+    return checked(valid);
 }
 
 }  // namespace nrx::replay

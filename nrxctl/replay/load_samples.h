@@ -24,6 +24,10 @@ namespace replay {
 void load(argument_cursor& arguments);
 void unload(argument_cursor& arguments);
 
+// Read the same arguments with the same messages, and do nothing else.
+arguments_check check_load(argument_cursor& arguments);
+arguments_check check_unload(argument_cursor& arguments);
+
 }  // namespace replay
 
 }  // namespace nrx

@@ -2,7 +2,8 @@
 
 #include <array>
 
-#include "nrxctl/base/arguments.h"
+#include "nrxctl/base/explanation.h"
+#include "nrxctl/base/failure_report.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/text_line.h"
 #include "nrxctl/replay/generate_samples.h"
@@ -31,16 +32,26 @@ void help(argument_cursor& /*arguments*/) {
     print_replay_usage();
 }
 
+constexpr auto any_number = subcommand_row::any_number;
+
 constexpr std::array subcommands{
     subcommand_row{"help", help},
-    subcommand_row{"load", replay::load},
-    subcommand_row{"unload", replay::unload},
-    subcommand_row{"schedule-enable", replay::schedule_enable},
-    subcommand_row{"enable", replay::enable},
-    subcommand_row{"disable", replay::disable},
+    subcommand_row{"load", replay::load, 4, replay::check_load},
+    subcommand_row{"unload", replay::unload, any_number, replay::check_unload},
+    subcommand_row{"schedule-enable", replay::schedule_enable, any_number, replay::check_schedule},
+    subcommand_row{"enable", replay::enable, any_number, replay::check_services},
+    subcommand_row{"disable", replay::disable, any_number, replay::check_services},
     subcommand_row{"get-status", replay::show_status},
-    subcommand_row{"generate", replay::generate},
+    subcommand_row{"generate", replay::generate, 4, replay::check_generate},
 };
+
+void refuse_subcommand(std::string_view subcommand) {
+    print_failure(text_line().text("Invalid subcommand ").text(subcommand).text("\n").view());
+    print_replay_usage();
+    explain([&] {
+        return unknown_keyword("subcommand", subcommand, "expected", keywords_of(subcommands));
+    });
+}
 
 }  // namespace
 
@@ -52,8 +63,20 @@ void print_replay_usage() {
 void replay_command(std::string_view subcommand, std::span<char* const> arguments, int& index) {
     argument_cursor cursor(arguments, index);
     if (run_subcommand(subcommands, subcommand, cursor)) return;
-    print_line(text_line().text("Invalid subcommand ").text(subcommand).text("\n").view());
-    print_replay_usage();
+    refuse_subcommand(subcommand);
+}
+
+std::span<const subcommand_row> replay_subcommands() {
+    return subcommands;
+}
+
+arguments_check check_replay_command(std::string_view subcommand, std::span<char* const> arguments,
+                                     int& index) {
+    argument_cursor cursor(arguments, index);
+    if (const subcommand_row* row = find_keyword(subcommands, subcommand))
+        return check_subcommand(*row, cursor);
+    refuse_subcommand(subcommand);
+    return arguments_check::refused;
 }
 
 }  // namespace nrx

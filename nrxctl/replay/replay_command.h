@@ -4,6 +4,8 @@
 #include <span>
 #include <string_view>
 
+#include "nrxctl/base/arguments.h"
+
 namespace nrx {
 
 // Runs a subcommand. Its arguments are those of the command line from index on, the option parser's
@@ -13,6 +15,15 @@ namespace nrx {
 // result. A malformed number ends the process with status 1, on the command line and in a sample
 // file.
 void replay_command(std::string_view subcommand, std::span<char* const> arguments, int& index);
+
+// The subcommands.
+std::span<const subcommand_row> replay_subcommands();
+
+// Reads the arguments as replay_command does, with the same messages, but does nothing else: no
+// call of the platform, and no sample file is opened. More arguments than the subcommand takes, and
+// numbers of which it would drop bits, are misused.
+arguments_check check_replay_command(std::string_view subcommand, std::span<char* const> arguments,
+                                     int& index);
 
 // Prints the usage of the family on standard output.
 void print_replay_usage();

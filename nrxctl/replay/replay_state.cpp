@@ -1,6 +1,7 @@
 #include "nrxctl/replay/replay_state.h"
 
 #include <array>
+#include <optional>
 #include <string>
 
 #include "nrxctl/base/check.h"
@@ -61,13 +62,41 @@ constexpr std::array state_rows{
 };
 constexpr name_table state_names(state_rows);
 
-// Sets the state of the services that the remaining arguments name.
-void set_state(argument_cursor& arguments, std::uint32_t delay, std::uint32_t state) {
+// Returns the services that the remaining arguments name; none, with a failure report, if there are
+// no arguments.
+std::vector<std::string_view> read_services(argument_cursor& arguments) {
     std::vector<std::string_view> services;
     while (const auto service = arguments.next())
         services.push_back(*service);
-    if (!check(!services.empty(), condition::arguments_remain)) return;
-    set_replay_state(services, delay, state);
+    check_explained(!services.empty(), condition::arguments_remain, [] {
+        return explanation{"a service is needed", ""};
+    });
+    return services;
+}
+
+void set_state(std::span<const std::string_view> services, std::uint32_t delay,
+               std::uint32_t state) {
+    if (!services.empty()) set_replay_state(services, delay, state);
+}
+
+struct schedule_args {
+    std::string_view delay_argument;
+    std::uint32_t delay;  // seconds
+    std::vector<std::string_view> services;
+};
+
+// Returns nullopt with a failure report if an argument is missing.
+std::optional<schedule_args> read_schedule_args(argument_cursor& arguments) {
+    const auto argument = arguments.next();
+    if (!check_explained(argument, condition::arguments_remain, [] {
+            return explanation{"schedule-enable needs SECONDS SERVICE...", ""};
+        })) {
+        return std::nullopt;
+    }
+    const std::uint32_t delay = parse_low_32_bits(*argument, "invalid delay");
+    const auto services = read_services(arguments);
+    if (services.empty()) return std::nullopt;
+    return schedule_args{*argument, delay, services};
 }
 
 void print_entry(const replay_state_entry& entry) {
@@ -89,24 +118,33 @@ void print_entry(const replay_state_entry& entry) {
 
 bool is_enabled() {
     if (!replay_status().empty()) return true;
-    print_line("Replay is not enabled");
+    print_failure("Replay is not enabled");
     return false;
 }
 
 void enable(argument_cursor& arguments) {
-    if (is_enabled()) set_state(arguments, 0, replay_state::enabled);
+    if (is_enabled()) set_state(read_services(arguments), 0, replay_state::enabled);
 }
 
 void disable(argument_cursor& arguments) {
-    if (is_enabled()) set_state(arguments, 0, replay_state::loaded);
+    if (is_enabled()) set_state(read_services(arguments), 0, replay_state::loaded);
 }
 
 void schedule_enable(argument_cursor& arguments) {
     if (!is_enabled()) return;
-    const auto delay_argument = arguments.next();
-    if (!check(delay_argument, condition::arguments_remain)) return;
-    const std::uint32_t delay = parse_low_32_bits(*delay_argument, "invalid delay");
-    set_state(arguments, delay, replay_state::enabled);
+    if (const auto args = read_schedule_args(arguments))
+        set_replay_state(args->services, args->delay, replay_state::enabled);
+}
+
+arguments_check check_services(argument_cursor& arguments) {
+    return checked(!read_services(arguments).empty());
+}
+
+arguments_check check_schedule(argument_cursor& arguments) {
+    const auto args = read_schedule_args(arguments);
+    if (!args) return arguments_check::refused;
+    return is_32_bit_number(args->delay_argument) ? arguments_check::accepted
+                                                  : arguments_check::misused;
 }
 
 void show_status(argument_cursor& /*arguments*/) {

@@ -41,7 +41,7 @@ void set_replay_state(std::span<const std::string_view> services, std::uint32_t 
 
 namespace replay {
 
-// Returns true if replay is enabled; otherwise says so in a line on standard output.
+// Returns true if replay is enabled; otherwise says so in a line on standard output, a failure.
 bool is_enabled();
 
 // Subcommands. Each reads its own arguments and reports its own failures.
@@ -49,6 +49,11 @@ void enable(argument_cursor& arguments);
 void disable(argument_cursor& arguments);
 void schedule_enable(argument_cursor& arguments);
 void show_status(argument_cursor& arguments);
+
+// Read the same arguments as enable, disable and schedule_enable, with the same messages, and do
+// nothing else. A delay that is not a number of 32 bits is misused.
+arguments_check check_services(argument_cursor& arguments);
+arguments_check check_schedule(argument_cursor& arguments);
 
 }  // namespace replay
 

@@ -1,7 +1,10 @@
 #include "nrxctl/replay/sample_file.h"
 
 #include <algorithm>
+#include <array>
 #include <limits>
+#include <string_view>
+#include <system_error>
 
 #include "nrxctl/base/check.h"
 #include "nrxctl/base/output.h"
@@ -158,23 +161,94 @@ private:
     sample_line split_;
 };
 
+// Files that are no text, by their first bytes.
+struct format_row {
+    std::string_view magic;
+    std::string_view explanation;
+};
+
+constexpr std::array formats{
+    format_row{"\x1f\x8b", "is compressed; expand it with gunzip"},
+    format_row{"BZh", "is compressed; expand it with bunzip2"},
+    format_row{"\xfd"
+               "7zXZ",
+               "is compressed; expand it with unxz"},
+    format_row{"\x28\xb5\x2f\xfd", "is compressed; expand it with unzstd"},
+    format_row{"PK\x03\x04", "is compressed; expand it with unzip"},
+};
+
+// Returns what is wrong with a file that begins like this, or an empty text if it may be text.
+std::string_view describe_format(std::string_view beginning) {
+    const auto match = std::find_if(formats.begin(), formats.end(), [&](const format_row& format) {
+        return beginning.starts_with(format.magic);
+    });
+    if (match != formats.end()) return match->explanation;
+    return beginning.find('\0') == std::string_view::npos ? "" : "is not text";
+}
+
+// Says in explanations which file and which line is wrong. A file that is no text is wrong as a
+// whole.
+class file_position {
+public:
+    file_position(const std::string& path, std::string_view beginning)
+        : path_(path),
+          format_(describe_format(beginning)),
+          scope_([this](explanation& given) { given = describe(given); }) {}
+
+    void next_line() { ++line_; }
+
+    // The whole file is wrong from here on.
+    void end_of_lines() { line_ = 0; }
+
+private:
+    [[nodiscard]] explanation describe(const explanation& given) const {
+        if (!format_.empty()) return {path_ + " " + std::string(format_), ""};
+        if (line_ == 0) return {path_ + " " + given.problem, given.expected};
+        return {path_ + ":" + std::to_string(line_) + ": " + given.problem, given.expected};
+    }
+
+    const std::string& path_;
+    std::string_view format_;
+    std::size_t line_ = 0;
+    explanation_scope scope_;
+};
+
+explanation wrong_field() {
+    return {"a field is not KEY=VALUE", "expected SERVICE,KEY=VALUE,..."};
+}
+
+explanation no_samples() {
+    return {"contains no samples", "expected lines SERVICE,KEY=VALUE,..."};
+}
+
 }  // namespace
 
 std::optional<sample_groups> read_sample_file(const std::string& path) {
     const block_output blocks;
     line_reader reader(path);
+    file_position position(path, reader.beginning());
     sample_collector collector(reader.file_size());
     for (;;) {
+        position.next_line();
         if (const std::size_t length = collector.try_pattern(reader.buffered())) {
             reader.consume(length);
             continue;
         }
         const auto line = reader.next();
         if (!line) break;
-        if (!check(collector.add(*line), "pair.size() == 2")) return std::nullopt;
+        if (!check_explained(collector.add(*line), "pair.size() == 2", wrong_field))
+            return std::nullopt;
     }
-    if (!check(reader.good(), "fs")) return std::nullopt;
-    return collector.finish();
+    position.end_of_lines();
+    if (!check_explained(reader.good(), "fs", [&] {
+            return explanation{"cannot be read: " + std::system_category().message(reader.error()),
+                               ""};
+        })) {
+        return std::nullopt;
+    }
+    auto groups = collector.finish();
+    if (groups.empty()) explain(no_samples);
+    return groups;
 }
 
 }  // namespace nrx

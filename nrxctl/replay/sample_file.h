@@ -25,7 +25,8 @@ using sample_groups = std::map<std::string, event_list, std::less<>>;
 //
 // Returns nullopt with a failure report if the file cannot be read or a field is not such a pair. A
 // number that is missing or malformed ends the process with status 1, as does a shake, after a
-// message on standard output.
+// message on standard output. A file without a sample gives no groups. What is wrong is explained
+// with the file and the line.
 std::optional<sample_groups> read_sample_file(const std::string& path);
 
 }  // namespace nrx

@@ -6,6 +6,7 @@
 
 #include "nrxctl/base/arguments.h"
 #include "nrxctl/base/end_process.h"
+#include "nrxctl/base/explanation.h"
 #include "nrxctl/base/little_endian.h"
 #include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
@@ -66,6 +67,7 @@ bool AxisEvent::parse(const sample_values& values) {
     parse_record(values, {sample_key::x, sample_key::y, sample_key::z});
     if (values[sample_key::shake] == "1") {
         print_line("Shake samples are not allowed");
+        explain([] { return explanation{"a shake cannot be played back", "remove the line"}; });
         end_process();
     }
     return true;
@@ -131,6 +133,10 @@ bool AxisEvent::init_generator(std::string_view signal_type) {
     return true;
 }
 
+std::vector<std::string_view> AxisEvent::signal_types() const {
+    return keywords_of(signals);
+}
+
 std::string AxisEvent::generate(std::string_view signal_type, std::uint32_t interval,
                                 std::uint32_t samples) {
     const signal_row* signal = find_keyword(signals, signal_type);
@@ -168,6 +174,10 @@ constexpr std::array event_classes{
 };
 
 }  // namespace
+
+std::vector<std::string_view> event_tags() {
+    return keywords_of(event_classes);
+}
 
 event_maker find_event_maker(std::string_view tag) {
     const event_class_row* row = find_keyword(event_classes, tag);

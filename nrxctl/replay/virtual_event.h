@@ -7,6 +7,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "nrxctl/replay/fast/event_memory.h"
 #include "nrxctl/replay/sample_line.h"
@@ -49,6 +50,9 @@ public:
     // Starts a generated signal. Returns false if this class does not generate such signals.
     virtual bool init_generator(std::string_view signal_type) = 0;
 
+    // The signals that this class generates.
+    [[nodiscard]] virtual std::vector<std::string_view> signal_types() const { return {}; }
+
     // Returns the next sample line, without a line feed, of a signal with that many samples, one
     // every interval microseconds. Returns an empty text if this class generates none.
     virtual std::string generate(std::string_view signal_type, std::uint32_t interval,
@@ -88,6 +92,7 @@ public:
     bool parse(const sample_values& values) override;
     // Seeds the C library's random generator with the time in seconds.
     bool init_generator(std::string_view signal_type) override;
+    [[nodiscard]] std::vector<std::string_view> signal_types() const override;
     std::string generate(std::string_view signal_type, std::uint32_t interval,
                          std::uint32_t samples) override;
 
@@ -130,6 +135,9 @@ public:
 
 // Makes a new event of one class.
 using event_maker = event_ptr (*)();
+
+// The tags of all classes.
+std::vector<std::string_view> event_tags();
 
 // Returns the maker for the class with that tag ("accel", "gyro", "compass" or "pressure"), or null
 // for any other tag.

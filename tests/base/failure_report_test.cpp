@@ -4,6 +4,8 @@
 #include <gtest/gtest.h>
 
 #include "nrxctl/base/check.h"
+#include "nrxctl/base/end_process.h"
+#include "nrxctl/base/output.h"
 #include "nrxctl/base/reply_fields.h"
 #include "tests/support/capture.h"
 
@@ -73,6 +75,29 @@ TEST(check, returns_whether_it_holds_and_names_its_source_line) {
     EXPECT_EQ(failed.raw_err, begin + "child" + place(2) + "\n" + begin + "result == 0 " +
                                   place(3) + " out of memory (0xe00002bd)\n" + begin +
                                   "length >= 2" + place(4) + "\n");
+}
+
+TEST(failure_count, counts_reports_and_lines_that_state_a_failure) {
+    const std::uint64_t before = nrx::failure_count();
+    EXPECT_EQ(capture([] { nrx::print_failure("Replay is not enabled"); }).out,
+              "Replay is not enabled\n");
+    reported(nullptr, "x", nullptr, nullptr, nullptr, 0, 0);
+    nrx::count_failure();
+    EXPECT_EQ(nrx::failure_count() - before, 3U);
+}
+
+TEST(end_process, ends_only_the_action_and_flushes_output) {
+    bool completed = true;
+    const auto result = capture([&] {
+        const nrx::block_output blocks;
+        nrx::print_line("before");
+        completed = nrx::run_to_completion([] { nrx::end_process(); });
+        nrx::print_line("after");
+        nrx::end_process();
+    });
+    EXPECT_FALSE(completed);
+    EXPECT_EQ(result.out, "before\nafter\n");
+    EXPECT_EQ(result.status, 1);
 }
 
 }  // namespace

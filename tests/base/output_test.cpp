@@ -1,9 +1,9 @@
 #include "nrxctl/base/output.h"
 
 #include <array>
+#include <csignal>
 #include <fcntl.h>
 #include <optional>
-#include <pty.h>
 #include <string>
 #include <thread>
 #include <unistd.h>
@@ -14,6 +14,7 @@
 #include "tests/support/argument_vector.h"
 #include "tests/support/device_test.h"
 #include "tests/support/rows.h"
+#include "tests/support/terminal.h"
 
 namespace tests {
 
@@ -55,6 +56,30 @@ TEST(descriptor_sink, whole_text_passes_a_small_nonblocking_pipe) {
     EXPECT_FALSE(sink.write("x\n"));
     EXPECT_TRUE(sink.write(""));
     EXPECT_TRUE(sink.failed());
+}
+
+TEST(descriptor_sink, tells_a_reader_that_went_away_from_lost_text) {
+    std::signal(SIGPIPE, SIG_IGN);
+    std::array<int, 2> ends{};
+    ASSERT_EQ(::pipe2(ends.data(), O_CLOEXEC), 0);
+    ::close(ends[0]);
+    const int full = ::open("/dev/full", O_WRONLY | O_CLOEXEC);
+    for (const auto& [descriptor, gone] : rows<int, bool>{{ends[1], true}, {full, false}}) {
+        nrx::descriptor_sink sink(descriptor);
+        nrx::terminal_sink filter(sink);
+        nrx::block_sink blocks(filter);
+        for (const auto stream : {nrx::standard_stream::output, nrx::standard_stream::error}) {
+            const nrx::scoped_sink installed(stream, blocks);
+            EXPECT_EQ(nrx::output_lost(), sink.failed() && !gone);
+            nrx::write_output("x\n");
+            blocks.write("x\n");
+            EXPECT_FALSE(blocks.flush());
+            EXPECT_EQ(blocks.reader_gone(), gone);
+            EXPECT_EQ(nrx::output_lost(), !gone);
+        }
+        ::close(descriptor);
+    }
+    std::signal(SIGPIPE, SIG_DFL);
 }
 
 TEST(terminal_sink, escapes_controls_and_invalid_utf8_alone) {
@@ -159,36 +184,6 @@ TEST(block_output, is_written_before_errors_and_waits) {
     nrx::print_line("five");
     EXPECT_EQ(sink.writes, (lines{"one\ntwo\n", "error\n", "three\n", "four\n", "five\n"}));
 }
-
-// Redirects a standard stream to a new pseudo-terminal.
-class terminal {
-public:
-    explicit terminal(int descriptor) : descriptor_(descriptor), saved_(::dup(descriptor)) {
-        int program_end = -1;
-        EXPECT_EQ(::openpty(&reader_, &program_end, nullptr, nullptr, nullptr), 0);
-        ::dup2(program_end, descriptor_);
-        ::close(program_end);
-    }
-    ~terminal() {
-        ::dup2(saved_, descriptor_);
-        ::close(saved_);
-        ::close(reader_);
-    }
-    terminal(const terminal&) = delete;
-    terminal& operator=(const terminal&) = delete;
-
-    // What was written to the terminal, which adds a carriage return to each line.
-    [[nodiscard]] std::string text() const {
-        std::array<char, 4096> buffer;
-        const ssize_t count = ::read(reader_, buffer.data(), buffer.size());
-        return {buffer.data(), static_cast<std::size_t>(std::max<ssize_t>(count, 0))};
-    }
-
-private:
-    int descriptor_;
-    int saved_;
-    int reader_ = -1;
-};
 
 class program_output : public device_test {};
 
