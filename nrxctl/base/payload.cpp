@@ -41,8 +41,8 @@ std::int32_t parse_value(std::string_view argument) {
             return static_cast<std::int32_t>(value);
     }
     explain([&] {
-        return explanation{quoted(argument) + " is no value of 32 bits",
-                           "expected hexadecimal digits, or 0d and decimal ones"};
+        return explanation{quoted(argument) + " is no value",
+                           "expected hexadecimal digits up to 7fffffff, or 0d and decimal ones"};
     });
     reject_argument("payload value is invalid", argument);
 }

@@ -1,10 +1,12 @@
 #include <cstddef>
 #include <cstdint>
 #include <limits>
+#include <string>
 #include <string_view>
 #include <vector>
 
 #include "nrxctl/nrxtoollib.h"
+#include "nrxctl/options/messages.h"
 #include "nrxctl/options/option_functions.h"
 
 namespace nrx::nrxctl {
@@ -14,98 +16,135 @@ namespace {
 constexpr std::size_t default_capacity = 65'536;
 constexpr std::uint32_t max_report_capacity = 1 << 20;
 
-report_id parse_report_id(std::string_view argument) {
-    return parse_number_up_to(std::numeric_limits<std::uint8_t>::max(), argument,
-                              "report id is invalid");
+report_id next_report_id(option_arguments& arguments) {
+    return arguments.next_number(std::numeric_limits<std::uint8_t>::max(), "a report id");
 }
 
-// Makes a call that stores a reply in a buffer, and dumps the reply.
+// Prints a reply as a dump, or writes its bytes.
+void dump_reply(platform::byte_view reply, reply_format format) {
+    if (format != reply_format::bytes) return hex_dump(reply);
+    write_output({reinterpret_cast<const char*>(reply.data()), reply.size()});
+}
+
+// Returns an action that makes a call, which stores a reply in a buffer, and dumps the reply.
 template <class Call>
-option_result dump_reply(const Call& call) {
-    std::vector<std::uint8_t> buffer(default_capacity);
-    platform::byte_span reply = buffer;
-    const platform::return_code result = call(reply);
-    if (result == platform::success) hex_dump(reply);
-    return result_of(result);
+option_action dump_action(option_arguments& arguments, Call call) {
+    return [call, format = arguments.settings().use_format()] {
+        std::vector<std::uint8_t> buffer(default_capacity);
+        platform::byte_span reply = buffer;
+        if (call(reply) == platform::success) dump_reply(reply, format);
+    };
+}
+
+// The name by which the printers of reports know a service, which may be given as an id. An id
+// without a service is returned as it is.
+std::string printed_name(std::string_view service) {
+    std::string name(service);
+    service_id id{};
+    if (is_service_id(service) && resolve_service_id(service, id)) service_name_for_id(id, name);
+    return std::string(without_prefix(name));
+}
+
+void print_reply(std::string_view service, report_id id, platform::byte_view report,
+                 reply_format format) {
+    if (format != reply_format::text) return dump_reply(report, format);
+    print_service_report(printed_name(service), id, report);
+}
+
+std::string report_name(std::string_view service, report_id id) {
+    text_line name;
+    name.text("report 0x").zero_padded_hex(id, 2).text(" of ").text(service);
+    return std::string(name.view());
+}
+
+std::string property_name(std::string_view service, std::string_view name) {
+    return std::string("property ").append(name).append(" of ").append(service);
 }
 
 }  // namespace
 
-option_result list(option_arguments& /*arguments*/) {
-    return result_of(list_services());
+option_action list(option_arguments& /*arguments*/) {
+    return [] { list_services(); };
 }
 
-option_result read_report(option_arguments& arguments) {
-    const auto id_argument = arguments.next();
-    if (!id_argument) return option_result::usage_error;
-    const report_id id = parse_report_id(*id_argument);
-    std::size_t capacity = default_capacity;
-    if (const auto argument = arguments.next()) {
-        capacity = parse_number_up_to(max_report_capacity, *argument, "capacity is invalid");
-    }
-    std::vector<std::uint8_t> buffer(capacity);
-    platform::byte_span report = buffer;
-    const platform::return_code result = get_report(arguments.required(), id, report);
-    if (result == platform::success) print_report(arguments.required(), id, report);
-    return result_of(result);
+option_action read_report(option_arguments& arguments) {
+    const std::string_view service = arguments.next();
+    const report_id id = next_report_id(arguments);
+    const std::size_t capacity = arguments.at_end()
+                                     ? default_capacity
+                                     : arguments.next_number(max_report_capacity, "a capacity");
+    return [=, format = arguments.settings().use_format()] {
+        std::vector<std::uint8_t> buffer(capacity);
+        platform::byte_span report = buffer;
+        if (get_report(service, id, report) == platform::success)
+            print_reply(service, id, report, format);
+    };
 }
 
-option_result write_report(option_arguments& arguments) {
-    const auto id_argument = arguments.next();
-    if (!id_argument) return option_result::usage_error;
-    const report_id id = parse_report_id(*id_argument);
-    const auto report = arguments.payload();
-    if (report.empty()) return option_result::usage_error;
-    return result_of(set_report(arguments.required(), id, report));
+option_action write_report(option_arguments& arguments) {
+    const std::string_view service = arguments.next();
+    const report_id id = next_report_id(arguments);
+    return [=, report = arguments.required_payload()] {
+        echo_payload(report_name(service, id), report);
+        set_report(service, id, report);
+    };
 }
 
-option_result run_command(option_arguments& arguments) {
-    const auto code_argument = arguments.next();
-    if (!code_argument) return option_result::usage_error;
-    const std::uint32_t code = parse_number_up_to(std::numeric_limits<std::uint32_t>::max(),
-                                                  *code_argument, "command code is invalid");
-    const auto payload = arguments.payload();
-    return dump_reply([&](platform::byte_span& reply) {
-        return send_command(arguments.required(), code, payload, reply);
+option_action run_command(option_arguments& arguments) {
+    const std::string_view service = arguments.next();
+    const std::uint32_t code =
+        arguments.next_number(std::numeric_limits<std::uint32_t>::max(), "a command code");
+    return dump_action(arguments, [=, payload = arguments.payload()](platform::byte_span& reply) {
+        echo_payload(service, payload);
+        return send_command(service, code, payload, reply);
     });
 }
 
-option_result call_scalar(option_arguments& arguments) {
+option_action call_scalar(option_arguments& arguments) {
+    const std::string_view service = arguments.next();
     std::vector<std::uint64_t> scalars;
-    while (const auto argument = arguments.next()) {
-        const std::int64_t scalar = parse_number(*argument, "scalar is invalid");
-        scalars.push_back(static_cast<std::uint64_t>(scalar));  // no argument has a minus sign
+    while (!arguments.at_end()) {
+        const std::string_view argument = arguments.next();
+        const auto scalar = read_number(argument);
+        if (!scalar || *scalar < 0)
+            throw usage_error{quoted(argument).append(
+                " is no scalar; expected a number from 0 to 9223372036854775807")};
+        scalars.push_back(static_cast<std::uint64_t>(*scalar));
     }
-    return result_of(call_scalar_method(arguments.required(), scalars));
+    return [=] { call_scalar_method(service, scalars); };
 }
 
-option_result get_property(option_arguments& arguments) {
-    const auto name = arguments.next();
-    if (!name) return option_result::usage_error;
-    return dump_reply([&](platform::byte_span& value) {
-        return get_named_property(arguments.required(), *name, value);
+option_action get_property(option_arguments& arguments) {
+    const std::string_view service = arguments.next();
+    const std::string_view name = arguments.next();
+    return dump_action(arguments, [=](platform::byte_span& value) {
+        return get_named_property(service, name, value);
     });
 }
 
-option_result set_property(option_arguments& arguments) {
-    const auto name = arguments.next();
-    if (!name) return option_result::usage_error;
-    const auto value = arguments.payload();
-    if (value.empty()) return option_result::usage_error;
-    return result_of(set_named_property(arguments.required(), *name, value));
+option_action set_property(option_arguments& arguments) {
+    const std::string_view service = arguments.next();
+    const std::string_view name = arguments.next();
+    return [=, value = arguments.required_payload()] {
+        echo_payload(property_name(service, name), value);
+        set_named_property(service, name, value);
+    };
 }
 
-option_result query_hid_driver(option_arguments& arguments) {
-    const auto input = arguments.payload();
-    if (input.empty()) return option_result::usage_error;
-    return dump_reply([&](platform::byte_span& output) { return call_hid_driver(input, output); });
+option_action query_hid_driver(option_arguments& arguments) {
+    return dump_action(arguments,
+                       [input = arguments.required_payload()](platform::byte_span& output) {
+                           echo_payload("the HID driver", input);
+                           return call_hid_driver(input, output);
+                       });
 }
 
-option_result set_mca(option_arguments& arguments) {
-    const std::string_view state = arguments.required();
+option_action set_mca(option_arguments& arguments) {
+    const std::string_view state = arguments.next();
     const bool on = state == "on";
-    if (!on && state != "off") reject_argument("mca is neither on nor off", state);
-    return result_of(switch_mca(on));
+    if (!on && state != "off")
+        throw usage_error{quoted(state).append(" is no state; expected on or off")};
+    return [=] { switch_mca(on); };
 }
 
 }  // namespace nrx::nrxctl

@@ -1,34 +1,52 @@
 #include <cstdint>
 #include <limits>
+#include <optional>
+#include <utility>
 
+#include "nrxctl/base/print_limit.h"
 #include "nrxctl/nrxtoollib.h"
 #include "nrxctl/options/option_functions.h"
 
 namespace nrx::nrxctl {
 
-option_result profile(option_arguments& arguments) {
-    arguments.run_family(profile_command);
-    return option_result::done;
+namespace {
+
+// Runs an action that may be a watch, which ends after a number of printed events, if one is given.
+option_action limited(std::optional<std::uint32_t> count, option_action run) {
+    return [count, run = std::move(run)] {
+        set_print_limit(count);
+        run();
+    };
 }
 
-option_result scm(option_arguments& arguments) {
-    arguments.run_family(scm_monitor);
-    return option_result::done;
+// Returns true for "monitor" and for a run, which begins with none of the subcommands.
+bool is_watch(std::string_view subcommand) {
+    return subcommand == "monitor" || find_keyword(profile_subcommands(), subcommand) == nullptr;
 }
 
-option_result replay(option_arguments& arguments) {
-    arguments.run_family(replay_command);
-    return option_result::done;
+}  // namespace
+
+option_action profile(option_arguments& arguments) {
+    const bool watches = is_watch(arguments.peek());
+    auto run = arguments.family_action({profile_command, check_profile_command});
+    return watches ? limited(arguments.settings().use_count(), std::move(run)) : run;
 }
 
-option_result show_sensor(option_arguments& arguments) {
-    std::uint32_t level = 1;
-    if (const auto argument = arguments.next()) {
-        constexpr auto max_level = std::numeric_limits<std::int32_t>::max();
-        level = parse_number_up_to(max_level, *argument, "level is invalid");
-    }
-    print_sensor_info(arguments.required(), static_cast<std::int32_t>(level));
-    return option_result::done;
+option_action scm(option_arguments& arguments) {
+    auto run = arguments.family_action({scm_monitor, check_scm_monitor});
+    return limited(arguments.settings().use_count(), std::move(run));
+}
+
+option_action replay(option_arguments& arguments) {
+    return arguments.family_action({replay_command, check_replay_command});
+}
+
+option_action show_sensor(option_arguments& arguments) {
+    constexpr auto max_level = std::numeric_limits<std::int32_t>::max();
+    const std::string_view name = arguments.next();
+    const std::uint32_t level =
+        arguments.at_end() ? 1 : arguments.next_number(max_level, "a level");
+    return [=] { print_sensor_info(name, static_cast<std::int32_t>(level)); };
 }
 
 }  // namespace nrx::nrxctl

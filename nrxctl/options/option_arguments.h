@@ -1,53 +1,91 @@
-// The arguments of one option of nrxctl, and how the option ended.
+// The arguments of one option of nrxctl, and what the options before it ask for.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <optional>
 #include <span>
 #include <string_view>
 #include <vector>
 
-#include "platform/return_code.h"
+#include "nrxctl/base/arguments.h"
+#include "nrxctl/options/command_line.h"
 
 namespace nrx::nrxctl {
 
-// How an option ended. The command families, --sensor and the watch of SPI status records report
-// their failures themselves and always end with done. A usage error is a missing argument.
-enum class option_result { done, failed, usage_error };
+// What an option does after the whole command line has been checked. Empty if there is nothing to
+// do. Failures are reported and counted by the library.
+using option_action = std::function<void()>;
 
-inline option_result result_of(platform::return_code code) {
-    return code == platform::success ? option_result::done : option_result::failed;
-}
+// How a reply is printed: with the printer of its kind, as a dump, or as its bytes.
+enum class reply_format { text, dump, bytes };
 
-// What follows an option on the command line. Reading an argument advances the option parser.
-class option_arguments {
+// What options say about those after them, such as --count about a watch.
+class option_settings {
 public:
-    // Takes the argument that the option requires (empty if it requires none), the whole command
-    // line, and the option parser's index, which is the position of the next argument.
-    option_arguments(std::string_view required, std::span<char* const> command_line, int& index)
-        : required_(required), command_line_(command_line), index_(index) {}
+    void set_count(std::uint32_t count);
+    void set_format(reply_format format, std::string_view option);
 
-    [[nodiscard]] std::string_view required() const { return required_; }
+    // Return a setting, which has then been of use.
+    std::optional<std::uint32_t> use_count();
+    reply_format use_format();
 
-    // Returns the next argument and advances; nullopt at the end and before the next option.
-    std::optional<std::string_view> next();
-
-    // Reads all arguments before the next option as a payload (see parse_payload). It is empty if
-    // there are none.
-    std::vector<std::uint8_t> payload();
-
-    // A command family: a function of the library that reads its own arguments.
-    using family_command = void (*)(std::string_view required, std::span<char* const> arguments,
-                                    int& index);
-
-    // Runs a command family on the arguments before the next long option. Skips those that it
-    // leaves unread, because it does not need them or has failed.
-    void run_family(family_command command);
+    // Throws usage_error if the latest setting of a kind was of no use.
+    void check_use() const;
 
 private:
-    std::string_view required_;
-    std::span<char* const> command_line_;
-    int& index_;
+    std::optional<std::uint32_t> count_;
+    bool count_unused_ = false;
+    reply_format format_ = reply_format::text;
+    std::string_view unused_format_;  // the option that set it
+};
+
+// The arguments of an option, read one by one. What cannot be read throws usage_error.
+class option_arguments {
+public:
+    option_arguments(std::span<char* const> arguments, option_settings& settings)
+        : arguments_(arguments), settings_(settings) {}
+
+    [[nodiscard]] option_settings& settings() const { return settings_; }
+
+    // Returns the next argument. There must be one.
+    std::string_view next();
+
+    // The argument that next() returns.
+    [[nodiscard]] std::string_view peek() const { return arguments_[position()]; }
+
+    // Returns true if all arguments have been read.
+    [[nodiscard]] bool at_end() const { return position() == arguments_.size(); }
+
+    // Reads the next argument as a number from 0 to max. The text says what it is: "a capacity".
+    std::uint32_t next_number(std::uint32_t max, std::string_view what);
+
+    // Reads the remaining arguments as a payload (see parse_payload), which is empty if there are
+    // none. May end the process.
+    std::vector<std::uint8_t> payload();
+
+    // The same, but there must be a value.
+    std::vector<std::uint8_t> required_payload();
+
+    // A command family of the library: a function that reads its own arguments, and one that checks
+    // them.
+    struct command_family {
+        void (*run)(std::string_view first, std::span<char* const> arguments, int& index);
+        arguments_check (*check)(std::string_view first, std::span<char* const> arguments,
+                                 int& index);
+    };
+
+    // Checks all arguments, which belong to a family, and returns the action that runs it. Ends the
+    // process if the library refuses them; throws usage_error if it would ignore or misread some.
+    option_action family_action(const command_family& family);
+
+private:
+    [[nodiscard]] std::size_t position() const { return static_cast<std::size_t>(index_); }
+
+    std::span<char* const> arguments_;
+    option_settings& settings_;
+    int index_ = 0;
 };
 
 }  // namespace nrx::nrxctl

@@ -1,4 +1,5 @@
-// The options of nrxctl as functions. The table in options.cpp names the arguments of each.
+// The options of nrxctl as functions: each reads and checks its arguments, and returns what it will
+// do. The table in options.cpp names the arguments of each and checks how many there are.
 #pragma once
 
 #include "nrxctl/options/option_arguments.h"
@@ -6,24 +7,29 @@
 namespace nrx::nrxctl {
 
 // Options that make one call of a driver.
-option_result list(option_arguments& arguments);
-option_result read_report(option_arguments& arguments);
-option_result write_report(option_arguments& arguments);
-option_result run_command(option_arguments& arguments);
-option_result call_scalar(option_arguments& arguments);
-option_result get_property(option_arguments& arguments);
-option_result set_property(option_arguments& arguments);
-option_result query_hid_driver(option_arguments& arguments);
-option_result set_mca(option_arguments& arguments);
+option_action list(option_arguments& arguments);
+option_action read_report(option_arguments& arguments);
+option_action write_report(option_arguments& arguments);
+option_action run_command(option_arguments& arguments);
+option_action call_scalar(option_arguments& arguments);
+option_action get_property(option_arguments& arguments);
+option_action set_property(option_arguments& arguments);
+option_action query_hid_driver(option_arguments& arguments);
+option_action set_mca(option_arguments& arguments);
 
 // Options that run a command family of the library.
-option_result profile(option_arguments& arguments);
-option_result scm(option_arguments& arguments);
-option_result replay(option_arguments& arguments);
-option_result show_sensor(option_arguments& arguments);
+option_action profile(option_arguments& arguments);
+option_action scm(option_arguments& arguments);
+option_action replay(option_arguments& arguments);
+option_action show_sensor(option_arguments& arguments);
 
 // Options that run the event loop until their time is over or an interrupt stops it.
-option_result watch_events(option_arguments& arguments);
-option_result watch_spi(option_arguments& arguments);
+option_action watch_events(option_arguments& arguments);
+option_action watch_spi(option_arguments& arguments);
+
+// Options about those that follow.
+option_action set_count(option_arguments& arguments);
+option_action set_raw(option_arguments& arguments);
+option_action set_hex(option_arguments& arguments);
 
 }  // namespace nrx::nrxctl

@@ -1,141 +1,170 @@
 #include "nrxctl/options/options.h"
 
+#include <algorithm>
 #include <array>
-#include <cstddef>
 #include <cstdlib>
-#include <getopt.h>
-#include <span>
+#include <new>
 #include <string>
-#include <string_view>
+#include <vector>
 
 #include "nrxctl/nrxtoollib.h"
+#include "nrxctl/options/command_line.h"
+#include "nrxctl/options/messages.h"
 #include "nrxctl/options/option_functions.h"
+#include "platform/host.h"
 
 namespace nrx::nrxctl {
 
 namespace {
 
-option_result help(option_arguments& arguments);
+constexpr int usage_error_status = 2;
 
-option_result version(option_arguments& /*arguments*/) {
-    print_line("nrxctl " NRXCTL_VERSION);
-    return option_result::done;
-}
+constexpr std::size_t any_number = subcommand_row::any_number;
 
-struct option_row {
-    const char* name;
-    bool requires_argument;
-    const char* arguments;
-    const char* purpose;
-    option_result (*run)(option_arguments& arguments);
-};
+option_action help(option_arguments& arguments);
+option_action version(option_arguments& arguments);
 
 constexpr std::array option_rows{
-    option_row{"profile", true, "SUBCOMMAND [WORD...]",
+    option_row{"profile", "SUBCOMMAND [ARGUMENT...]", 1, any_number,
                "control the profiler; the subcommand help shows its usage", profile},
-    option_row{"scm", true, "DURATION CONFIG...",
-               "print the coprocessor's bus transfers for DURATION milliseconds, or auto", scm},
-    option_row{"replay", true, "SUBCOMMAND [WORD...]",
-               "play samples back in place of live ones; the subcommand help lists the others",
-               replay},
-    option_row{"sensor", true, "NAME [LEVEL]",
-               "print a sensor's configuration; at level 2 also its clients and state",
-               show_sensor},
-    option_row{"list", false, "", "list the interface services with their ids", list},
-    option_row{"report", true, "SERVICE ID [CAPACITY]", "read a report and print it", read_report},
-    option_row{"set-report", true, "SERVICE ID [u8|u16|u32] VALUE...", "write a report",
+    option_row{"scm", "DURATION CONFIG...", 1, any_number,
+               "print the coprocessor's bus transfers for milliseconds, or auto", scm},
+    option_row{"replay", "SUBCOMMAND [ARGUMENT...]", 1, any_number,
+               "play samples back in place of live ones; see the subcommand help", replay},
+    option_row{"sensor", "NAME [LEVEL]", 1, 2,
+               "print a sensor's configuration; at level 2 also clients and state", show_sensor},
+    option_row{"list", "", 0, 0, "list the interface services with their ids", list},
+    option_row{"report", "SERVICE ID [CAPACITY]", 2, 3, "read a report and print it", read_report},
+    option_row{"set-report", "SERVICE ID [u8|u16|u32] VALUE...", 3, any_number, "write a report",
                write_report},
-    option_row{"command", true, "SERVICE CODE [u8|u16|u32] [VALUE...]",
+    option_row{"command", "SERVICE CODE [u8|u16|u32] [VALUE...]", 2, any_number,
                "send a command and dump its reply", run_command},
-    option_row{"scalar", true, "SERVICE [SCALAR...]", "call the scalar method of a service",
-               call_scalar},
-    option_row{"get-property", true, "SERVICE NAME", "dump a named property of a service",
+    option_row{"scalar", "SERVICE [SCALAR...]", 1, any_number,
+               "call the scalar method of a service", call_scalar},
+    option_row{"get-property", "SERVICE NAME", 2, 2, "dump a named property of a service",
                get_property},
-    option_row{"set-property", true, "SERVICE NAME [u8|u16|u32] VALUE...",
+    option_row{"set-property", "SERVICE NAME [u8|u16|u32] VALUE...", 3, any_number,
                "set a named property of a service", set_property},
-    option_row{"hid-driver", false, "[u8|u16|u32] VALUE...",
+    option_row{"hid-driver", "[u8|u16|u32] VALUE...", 1, any_number,
                "call the HID driver and dump its reply", query_hid_driver},
-    option_row{"mca", true, "on|off", "switch the MCA", set_mca},
-    option_row{"spi-status", true, "SERVICE MODE",
+    option_row{"mca", "on|off", 1, 1, "switch the MCA", set_mca},
+    option_row{"spi-status", "SERVICE MODE", 2, 2,
                "print the SPI status records of a HID device until an interrupt", watch_spi},
-    option_row{"events", false, "[SECONDS]", "print HID events, for so long or until an interrupt",
+    option_row{"events", "[SECONDS]", 0, 1, "print HID events, for so long or until an interrupt",
                watch_events},
-    option_row{"help", false, "", "print this help", help},
-    option_row{"version", false, "", "print the version", version},
+    option_row{"count", "N", 1, 1, "end the watches that follow after N events or records",
+               set_count},
+    option_row{"hex", "", 0, 0, "dump the replies that follow, whatever printer they have",
+               set_hex},
+    option_row{"raw", "", 0, 0, "write the bytes of the replies that follow", set_raw},
+    option_row{"help", "", 0, 0, "print this help", help},
+    option_row{"version", "", 0, 0, "print the version and the host", version},
 };
 
-option_result help(option_arguments& /*arguments*/) {
-    constexpr std::size_t usage_width = 50;
+std::string host_line() {
+    return "host: " + platform::host_description();
+}
+
+void print_help() {
     print_line("usage: nrxctl OPTION...");
     for (const option_row& row : option_rows) {
         text_line usage;
-        usage.text("--").text(row.name).text(" ").text(row.arguments);
-        text_line line;
-        line.text("  ").pad_right(usage.view(), usage_width).text(" ").text(row.purpose);
-        print_line(line.view());
+        usage.text("  --").text(row.name).text(row.arguments.empty() ? "" : " ");
+        print_line(usage.text(row.arguments).view());
+        print_line(text_line().text("        ").text(row.purpose).view());
     }
-    print_line("Options are carried out in order. A SERVICE is a registry name or a service id;");
-    print_line("VALUEs are hexadecimal, or decimal after 0d; all other numbers are decimal, or");
-    print_line("hexadecimal after 0x.");
-    return option_result::done;
+    print_line("All options are checked first, then run in order. A SERVICE is a registry name");
+    print_line("or a service id. VALUEs are hexadecimal, or decimal after 0d; all other numbers");
+    print_line("are decimal, or hexadecimal after 0x.");
+    print_line(host_line());
 }
 
-// Reports a usage error on standard error and returns the exit status for it.
-int report_usage_error(std::string_view message) {
-    constexpr int usage_error_status = 2;
-    text_line lines;
-    lines.text("nrxctl: ").text(message).text("\nTry nrxctl --help.\n");
-    write_error(lines.view());
-    return usage_error_status;
+option_action help(option_arguments& /*arguments*/) {
+    return print_help;
 }
 
-int report_missing_argument(std::string_view option) {
-    return report_usage_error(text_line().text("a word is missing after ").text(option).view());
+option_action version(option_arguments& /*arguments*/) {
+    return [] {
+        print_line("nrxctl " NRXCTL_VERSION);
+        print_line(host_line());
+    };
 }
 
-int report_unknown_option(std::string_view option) {
-    return report_usage_error(text_line().text("unknown option ").text(option).view());
+// Returns what the option does. Throws usage_error, or ends the process, if an argument is wrong.
+option_action read_option(const parsed_option& parsed, option_settings& settings) {
+    const option_row& row = option_rows[parsed.option];
+    const auto option = [&] { return std::string("--").append(row.name); };
+    if (parsed.arguments.size() < row.min_arguments)
+        throw usage_error{option() + " needs " + std::string(row.arguments)};
+    if (parsed.arguments.size() > row.max_arguments)
+        throw usage_error{"unexpected argument " + quoted(parsed.arguments[row.max_arguments]) +
+                          " after " + option()};
+    option_arguments arguments(parsed.arguments, settings);
+    return row.read(arguments);
 }
 
-int report_unknown_argument(std::string_view argument) {
-    return report_usage_error(text_line().text("unknown word ").text(argument).view());
+std::vector<parsed_option> split_options(std::span<char* const> command_line) {
+    std::vector<std::string_view> names;
+    std::transform(option_rows.begin(), option_rows.end(), std::back_inserter(names),
+                   [](const option_row& row) { return row.name; });
+    return split_command_line(command_line.subspan(std::min<std::size_t>(command_line.size(), 1)),
+                              names);
 }
 
-// Returns the table of the option parser. The value of an option is the number of its row.
-std::array<option, option_rows.size() + 1> parser_options() {
-    std::array<option, option_rows.size() + 1> options{};
-    std::size_t number = 0;
-    for (const option_row& row : option_rows) {
-        options[number] = {row.name, row.requires_argument ? required_argument : no_argument,
-                           nullptr, static_cast<int>(number)};
-        ++number;
-    }
-    return options;
+std::vector<option_action> read_options(std::span<const parsed_option> options) {
+    if (options.empty()) throw usage_error{"an option is needed"};
+    std::vector<option_action> actions;
+    option_settings settings;
+    for (const parsed_option& parsed : options)
+        actions.push_back(read_option(parsed, settings));
+    settings.check_use();
+    return actions;
+}
+
+// Records that a watch has not printed are counted at its end.
+void report_unprintable_records(std::uint64_t records) {
+    if (records == 0) return;
+    text_line line;
+    line.number(records).text(records == 1 ? " record was" : " records were");
+    print_message(line.text(" not printed: the text is not UTF-8").view());
+}
+
+void run_action(const option_action& action) {
+    if (!action) return;
+    const std::uint64_t unprintable = unprintable_record_count();
+    action();
+    report_unprintable_records(unprintable_record_count() - unprintable);
 }
 
 }  // namespace
 
+std::span<const option_row> option_table() {
+    return option_rows;
+}
+
 int run(int argc, char** argv) {
-    const std::span<char* const> command_line(argv, static_cast<std::size_t>(argc));
-    const auto options = parser_options();
-    int status = EXIT_SUCCESS;
-    bool has_options = false;
-    while (true) {
-        const auto position = static_cast<std::size_t>(optind);
-        const int value = getopt_long(argc, argv, "+:", options.data(), nullptr);
-        if (value == -1) break;
-        if (value == ':') return report_missing_argument(command_line[position]);
-        if (value == '?') return report_unknown_option(command_line[position]);
-        has_options = true;
-        const option_row& row = option_rows[static_cast<std::size_t>(value)];
-        option_arguments arguments{optarg == nullptr ? "" : optarg, command_line, optind};
-        const option_result result = row.run(arguments);
-        if (result == option_result::usage_error)
-            return report_missing_argument(std::string("--") + row.name);
-        if (result == option_result::failed) status = EXIT_FAILURE;
+    const std::uint64_t failures = failure_count();
+    explanation_list explanations;
+    bool completed = false;
+    try {
+        const auto options = split_options({argv, static_cast<std::size_t>(argc)});
+        completed = run_to_completion([&] {
+            const auto actions = read_options(options);
+            announce_host();
+            for (const option_action& action : actions) {
+                run_action(action);
+                print_explanations(explanations);
+            }
+        });
+    } catch (const usage_error& error) {
+        print_message(error.message + "\nTry nrxctl --help.");
+        return usage_error_status;
+    } catch (const std::bad_alloc&) {
+        write_error("nrxctl: out of memory\n");
     }
-    if (optind < argc) return report_unknown_argument(argv[optind]);
-    return has_options ? status : report_usage_error("an option is needed");
+    print_explanations(explanations);
+    const bool succeeded = completed && failure_count() == failures && !output_lost();
+    return succeeded ? EXIT_SUCCESS : EXIT_FAILURE;
 }
 
 }  // namespace nrx::nrxctl

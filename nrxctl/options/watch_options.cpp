@@ -3,6 +3,7 @@
 #include <limits>
 #include <optional>
 
+#include "nrxctl/base/print_limit.h"
 #include "nrxctl/nrxtoollib.h"
 #include "nrxctl/options/option_functions.h"
 #include "platform/clock.h"
@@ -35,35 +36,33 @@ void set_clock_references() {
 
 }  // namespace
 
-option_result watch_events(option_arguments& arguments) {
+option_action watch_events(option_arguments& arguments) {
     std::optional<std::chrono::seconds> duration;
-    if (const auto argument = arguments.next()) {
+    if (!arguments.at_end()) {
         constexpr auto max_seconds = std::numeric_limits<std::int32_t>::max();
-        duration =
-            std::chrono::seconds(parse_number_up_to(max_seconds, *argument, "seconds are invalid"));
+        duration = std::chrono::seconds(arguments.next_number(max_seconds, "a number of seconds"));
     }
-    set_clock_references();
-    const loop_interrupt_handler handler;
-    return result_of(watch_hid_events(duration));
+    return [duration, count = arguments.settings().use_count()] {
+        set_print_limit(count);
+        set_clock_references();
+        const loop_interrupt_handler handler;
+        watch_hid_events(duration);
+    };
 }
 
 // Switches the mode off after the watch even if the watch failed or was interrupted.
-option_result watch_spi(option_arguments& arguments) {
-    const auto mode_argument = arguments.next();
-    if (!mode_argument) return option_result::usage_error;
+option_action watch_spi(option_arguments& arguments) {
+    const std::string_view service = arguments.next();
     constexpr auto max_mode = std::numeric_limits<std::uint32_t>::max();
-    const std::uint32_t mode = parse_number_up_to(max_mode, *mode_argument, "mode is invalid");
-    service_id id{};
-    if (!resolve_service_id(arguments.required(), id)) {
-        text_line message;
-        message.text("service is invalid (").text(arguments.required()).text(")");
-        print_line(message.view());
-        return option_result::failed;
-    }
-    const loop_interrupt_handler handler;
-    const platform::return_code result = watch_spi_status(id, mode);
-    if (mode != 0) watch_spi_status(id, 0);
-    return result_of(result);
+    const std::uint32_t mode = arguments.next_number(max_mode, "a mode");
+    return [service, mode, count = arguments.settings().use_count()] {
+        service_id id{};
+        if (!resolve_service_id(service, id)) return count_failure();
+        set_print_limit(count);
+        const loop_interrupt_handler handler;
+        watch_spi_status(id, mode);
+        if (mode != 0) watch_spi_status(id, 0);
+    };
 }
 
 }  // namespace nrx::nrxctl

@@ -1,114 +1,26 @@
-// The options of nrxctl in this process, on services of the embedded device with a manual clock.
+// What the options of nrxctl do once the command line is accepted.
 #include "nrxctl/options/options.h"
 
+#include <algorithm>
 #include <chrono>
 #include <csignal>
 #include <cstdio>
-#include <cstdlib>
-#include <ctime>
 #include <fstream>
-#include <getopt.h>
-#include <optional>
+#include <new>
 #include <unistd.h>
 
-#include "nrxctl/base/clock_references.h"
-#include "platform/clock.h"
-#include "platform/virtual/time_sync.h"
 #include "platform/virtual/wrist/parts.h"
 #include "tests/golden/golden_text.h"
+#include "tests/nrxctl/options_host.h"
 #include "tests/support/argument_vector.h"
-#include "tests/support/device_test.h"
 #include "tests/support/rows.h"
+#include "tests/support/terminal.h"
 
 namespace tests {
 
-class options : public device_test {
-public:
-    options() {
-        using namespace platform::simulated;
-        add_interface_services(host);
-        add_hid_devices(host);
-        add_profiler(host);
-        add_replay(host);
-        add_named_properties(host);
-        add_mca(host);
-        add_hid_events(host);
-        host.clock().set_wall_start(std::chrono::seconds(1'000'000'000));
-        host.set_boot_time({1'000'000'000, 0});
-        add_time_sync(host, [] { return sync_point{0, 1'000'000'000'000'000'000}; });
-        ::setenv("TZ", "UTC", 1);
-        ::tzset();
-        nrx::tick_period = platform::tick_period();
-    }
+using options = options_host;
 
-protected:
-    // Runs arguments with a space between them. The status is that of a return from main or of the
-    // end of the process.
-    static outcome run(const std::string& arguments) {
-        argument_vector command_line(split("nrxctl " + arguments));
-        optind = 1;
-        std::optional<int> returned;
-        auto result =
-            capture([&] { returned = nrx::nrxctl::run(command_line.argc(), command_line.argv()); });
-        if (!result.status) result.status = returned;
-        return result;
-    }
-
-    interface_driver& service = add_service(host, "x", 0x70);
-};
-
-TEST_F(options, report_a_usage_error_with_status_2) {
-    const std::string missing = "a word is missing after ";
-    for (const auto& [arguments, message] : rows<std::string, std::string>{
-             {"", "an option is needed"},
-             {"--", "an option is needed"},
-             {"--foo", "unknown option --foo"},
-             {"-x", "unknown option -x"},
-             {"--help=x", "unknown option --help=x"},
-             {"list", "unknown word list"},
-             {"--list more", "unknown word more"},
-             {"--sensor accel 1 2", "unknown word 2"},
-             {"--profile", missing + "--profile"},
-             {"--version --sensor", missing + "--sensor"},
-             {"--report accel", missing + "--report"},
-             {"--report accel --list", missing + "--report"},
-             {"--set-report accel", missing + "--set-report"},
-             {"--set-report accel 1", missing + "--set-report"},
-             {"--command accel", missing + "--command"},
-             {"--get-property accel", missing + "--get-property"},
-             {"--set-property accel", missing + "--set-property"},
-             {"--set-property accel gain u8", missing + "--set-property"},
-             {"--hid-driver --list", missing + "--hid-driver"},
-             {"--spi-status accel", missing + "--spi-status"},
-         }) {
-        const auto result = run(arguments);
-        EXPECT_EQ(result.status, 2) << message;
-        EXPECT_EQ(result.err, "nrxctl: " + message + "\nTry nrxctl --help.\n");
-    }
-}
-
-TEST_F(options, reject_an_argument_with_an_invalid_value_with_status_1) {
-    for (const auto& [arguments, message] : rows<std::string, std::string>{
-             {"--report accel d0", "report id is invalid (d0)\n"},
-             {"--report accel 256", "report id is invalid (256)\n"},
-             {"--set-report accel 0x100 1", "report id is invalid (0x100)\n"},
-             {"--report accel 1 0x100001", "capacity is invalid (0x100001)\n"},
-             {"--sensor accel 0x80000000", "level is invalid (0x80000000)\n"},
-             {"--scalar accel 1 x", "scalar is invalid (x)\n"},
-             {"--spi-status accel 4294967296", "mode is invalid (4294967296)\n"},
-             {"--spi-status 2147483648 1", "service is invalid (2147483648)\n"},
-             {"--spi-status 0x80000000 1", "service is invalid (0x80000000)\n"},
-             {"--spi-status -2147483648 1", "service is invalid (-2147483648)\n"},
-             {"--events 2147483648", "seconds are invalid (2147483648)\n"},
-             {"--profile human sensor:accel", "duration parameter is invalid (sensor:accel)\n"},
-             {"--mca On", "mca is neither on nor off (On)\n"},
-             {"--command accel 0x100000000", "command code is invalid (0x100000000)\n"},
-         }) {
-        const auto result = run(arguments);
-        EXPECT_EQ(result.out, message);
-        EXPECT_EQ(result.status, 1) << arguments;
-    }
-}
+const std::string version = "nrxctl " NRXCTL_VERSION "\nhost: virtual NRX\n";
 
 TEST_F(options, accept_the_extreme_values_of_an_argument) {
     service.set_report(0, {1});
@@ -148,41 +60,57 @@ TEST_F(options, make_one_driver_call_each_and_fail_with_it) {
               "00000000: 01 00 00 00                                       | ....\n"
               "Turning OFF MCA\n"
               "00000000: 01 00 00 00                                       | ....\n"
-              "Found an id for service = 17\n"
-              "nrxctl " NRXCTL_VERSION "\n");
-    for (const auto& [arguments, out] : rows<std::string, std::string>{
-             {"--report nobody 1", ""},
-             {"--report profile 0xd5 3", ""},
-             {"--set-report profile 0 1", ""},
+              "Found an id for service = 17\n" +
+                  version);
+}
+
+// Every option after the failed one is still run.
+TEST_F(options, fail_with_status_1_and_say_what_failed) {
+    for (const auto& [arguments, out, reports, message] :
+         rows<std::string, std::string, std::size_t, std::string>{
+             {"--report nobody 1", "", 1, "no service \"nobody\"; --list shows all"},
+             {"--report acel 1", "", 1,
+              "no service \"acel\"; --list shows all (did you mean accel?)"},
+             {"--report wqr-buton 0xd0", "", 1,
+              "no service \"wqr-buton\"; --list shows all (did you mean wqr-button?)"},
+             {"--report 0x99 1", "", 1, "no service \"0x99\"; --list shows all"},
+             {"--report profile 0xd5 3", "", 1, ""},
+             {"--set-report profile 0 1", "", 1, ""},
              {"--command profile 0x7f 1 2",
               "command 0x7f is not supported for device\n"
-              "payload 00000000: 01 02                                             | ..\n"},
-             {"--scalar accel", ""},
-             {"--scalar mux 1", ""},
-             {"--get-property accel colour", ""},
-             {"--set-property mux x 1", ""},
-             {"--hid-driver 1", ""},
-             {"--spi-status nobody 1", "service is invalid (nobody)\n"},
+              "payload 00000000: 01 02                                             | ..\n",
+              1, ""},
+             {"--scalar accel", "", 1, ""},
+             {"--scalar mux 1", "", 1, ""},
+             {"--get-property accel colour", "", 1, ""},
+             {"--set-property mux x 1", "", 1, ""},
+             {"--hid-driver 1", "", 1, ""},
+             {"--spi-status nobody 1", "", 1, "no service \"nobody\"; --list shows all"},
+             {"--spi-status 0x80000000 1", "", 0, "no service \"0x80000000\"; --list shows all"},
+             {"--spi-status arc 0", "Found an id for service = 50\n", 1,
+              "no HID device for service 50"},
+             {"--sensor mca", "sensor mca doesn't provide sensor info (kr=e00002c7)\n\n", 0, ""},
+             {"--replay enable nobody", "", 2, "no service \"nobody\"; --list shows all"},
+             {"--replay enable mux", "", 2, ""},
+             {"--replay unload mux", "Service mux can't be unloaded\n", 0, ""},
+             {"--replay unload 0x80000000", "Service 0x80000000 not found\n", 0,
+              "no service \"0x80000000\"; --list shows all"},
+             {"--profile config trace:9:7",
+              "    profiler trace      is enabled [component=9, reports=7 services= all]\n"
+              "fw config: At least one config failed\n"
+              "kext config: At least one config failed\n",
+              0, ""},
          }) {
         const auto result = run(arguments + " --version");
         EXPECT_EQ(result.status, 1) << arguments;
-        EXPECT_NE(result.err, "") << arguments;
-        EXPECT_EQ(result.out, out + "nrxctl " NRXCTL_VERSION "\n");
+        EXPECT_EQ(result.out, out + version);
+        const lines messages = split(result.err, '\n');
+        ASSERT_EQ(messages.size(), reports + (message.empty() ? 0 : 1)) << result.err;
+        for (std::size_t i = 0; i < reports; ++i)
+            EXPECT_TRUE(messages[i].starts_with("Assertion failed: nrxtoollib: ")) << result.err;
+        if (message.empty()) continue;
+        EXPECT_EQ(messages.back(), "nrxctl: " + message);
     }
-}
-
-TEST_F(options, give_a_family_the_arguments_before_the_next_long_option) {
-    for (const char* arguments : {"--profile config bogus sensor:gyro", "--scm 10 bogus scm:smb0",
-                                  "--profile get-logs bad errdump", "--profile monitor 1 human",
-                                  "--replay get-status left over -x"}) {
-        const auto result = run(std::string(arguments) + " --version");
-        EXPECT_EQ(result.status, 0) << arguments;
-        EXPECT_TRUE(result.out.ends_with("nrxctl " NRXCTL_VERSION "\n")) << arguments;
-    }
-    const std::string accel = "    profiler sensor     is enabled [component=accel, reports=4]\n";
-    EXPECT_EQ(run("--profile config sensor:accel:data --profile get-config").out,
-              accel + "No client is connected\n\nActive components in kext:\n" + accel +
-                  "\nActive components in fw:\n" + accel);
 }
 
 TEST_F(options, print_what_arrives_in_a_time_or_before_an_interrupt) {
@@ -204,11 +132,172 @@ TEST_F(options, print_what_arrives_in_a_time_or_before_an_interrupt) {
     }
 }
 
+std::size_t count_of(const std::string& part, const std::string& text) {
+    std::size_t count = 0;
+    for (std::size_t at = text.find(part); at != std::string::npos; at = text.find(part, at + 1))
+        ++count;
+    return count;
+}
+
+TEST_F(options, end_each_watch_after_a_count_of_printed_events) {
+    for (const auto& [arguments, event, end] : rows<std::string, std::string, std::string>{
+             {"--events", "\n", "\n"},
+             {"--spi-status gyro 2", "timestamp: ", "\nFound an id for service = 17\n"},
+             {"--profile auto sensor:accel,gyro:data", "prof-event ", "\ndone\n"},
+             {"--profile human auto sensor:accel,gyro:data", "{  'category'", "\ndone\n"},
+             {"--profile config sensor:accel:data --profile enable --profile monitor",
+              "prof-event ", "\ndone\n"},
+             {"--scm auto scm:smb0:ch4", "smb0.4: ", "\ndone\n"},
+         }) {
+        for (const std::size_t count : {1U, 2U, 5U}) {
+            const auto result = run("--count " + std::to_string(count) + " " + arguments);
+            EXPECT_EQ(result.status, 0);
+            EXPECT_EQ(result.err, "");
+            EXPECT_EQ(count_of(event, result.out), count) << arguments;
+            EXPECT_TRUE(result.out.ends_with(end)) << result.out;
+        }
+    }
+    // Each watch counts for itself, until there is another count; stored records do not count.
+    EXPECT_EQ(count_of("\n", run("--count 2 --events --events 1 --count 1 --events").out), 5U);
+    EXPECT_GT(count_of("prof-event", run("--count 1 --events --profile get-logs").out), 1U);
+    EXPECT_GT(count_of("\n", run("--events 1").out), 5U);
+}
+
+TEST_F(options, say_how_many_records_are_not_utf8) {
+    auto& profile = platform::simulated::interface_of(host, "profile");
+    byte_list record(48, 0xff);  // the function name is not UTF-8
+    std::copy_n(byte_list{9, 0, 4, 0}.begin(), 4, record.begin());
+    for (const auto& [records, message] :
+         rows<std::size_t, std::string>{{1, "1 record was"}, {2, "2 records were"}}) {
+        std::size_t reads = 0;
+        profile.set_report_source(0xd1, [&](std::size_t, byte_list& reply) {
+            for (std::size_t i = 0; reads == 0 && i < records; ++i)
+                reply.insert(reply.end(), record.begin(), record.end());
+            ++reads;
+            return platform::success;
+        });
+        const auto result = run("--profile get-logs fwdump human");
+        EXPECT_EQ(result.status, 0);
+        EXPECT_EQ(result.err, "nrxctl: " + message + " not printed: the text is not UTF-8\n");
+    }
+}
+
+TEST_F(options, print_a_report_the_same_by_name_and_by_id) {
+    for (const auto& [by_name, by_id, beginning] : rows<std::string, std::string, std::string>{
+             {"mux 0xd0", "0x20 0xd0", "data: 1 timestamp:"},
+             {"wqr-button 0xd7", "64 0xd7", "kpdx_stats\n-- Last Button Press --\n"},
+             {"WQR_wqr-button 0xd8", "0x40 0xd8", "Length: 1479, expected 1479\nASSET ["},
+             {"arc 0xd0", "50 0xd0", "00000000: "},
+         }) {
+        const std::string out = run("--report " + by_name).out;
+        EXPECT_TRUE(out.starts_with(beginning)) << out;
+        EXPECT_EQ(run("--report " + by_id).out, out);
+    }
+}
+
+TEST_F(options, show_a_reply_as_a_dump_or_as_bytes) {
+    service.set_report(0xd0, {0x1b, 0, 0xff});
+    service.set_named_property("p", {1, 2});
+    service.set_command(7, [](platform::byte_view payload, byte_list& reply) {
+        reply.assign(payload.begin(), payload.end());
+        return platform::success;
+    });
+    const std::string requests = "--report 0x70 0xd0 --get-property x p --command x 7 41 0d10";
+    EXPECT_EQ(run("--raw " + requests).out, std::string("\x1b\0\xff\1\2A\n", 7));
+    EXPECT_EQ(run("--hex " + requests).out,
+              "00000000: 1b 00 ff                                          | ...\n"
+              "00000000: 01 02                                             | ..\n"
+              "00000000: 41 0a                                             | A.\n");
+    const std::string button = run("--hex --report wqr-button 0xd7").out;
+    EXPECT_TRUE(button.starts_with("00000000: ")) << button;
+}
+
+TEST_F(options, echo_what_they_write_and_name_the_host_on_a_terminal) {
+    const terminal screen(STDERR_FILENO);
+    const auto echoed = [&](const std::string& arguments) { return run(arguments).err; };
+    const std::string host_line = "nrxctl: the host is virtual NRX\n";
+    EXPECT_EQ(echoed("--version --list"), host_line);
+    EXPECT_EQ(echoed("--foo"), "nrxctl: unknown option --foo\nTry nrxctl --help.\n");
+    service.set_report(10, {});
+    EXPECT_EQ(echoed("--set-report x 10 10"),
+              host_line +
+                  "nrxctl: writing 1 byte to report 0x0a of x:\n"
+                  "00000000: 10                                                | .\n");
+    EXPECT_EQ(echoed("--set-property accel gain u16 1 0d10"),
+              host_line +
+                  "nrxctl: writing 4 bytes to property gain of accel:\n"
+                  "00000000: 01 00 0a 00                                       | ....\n");
+    EXPECT_EQ(echoed("--hid-driver u32 1 0").substr(0, host_line.size() + 42),
+              host_line + "nrxctl: writing 8 bytes to the HID driver:");
+    EXPECT_EQ(echoed("--command profile 0x21"), host_line);
+}
+
+TEST_F(options, do_not_write_bytes_to_a_terminal) {
+    const terminal screen(STDOUT_FILENO);
+    const auto result = run("--raw --report arc 0xd0");
+    EXPECT_EQ(result.status, 2);
+    EXPECT_EQ(result.err,
+              "nrxctl: --raw writes bytes, which are not for a terminal; redirect the output\n"
+              "Try nrxctl --help.\n");
+    EXPECT_EQ(host.calls_made(), 0U);
+}
+
+TEST_F(options, end_with_one_line_when_memory_runs_out) {
+    service.set_scalar_method(
+        [](std::span<const std::uint64_t>) -> platform::return_code { throw std::bad_alloc(); });
+    const auto result = run("--version --scalar x 1 --version");
+    EXPECT_EQ(result.status, 1);
+    EXPECT_EQ(result.err, "nrxctl: out of memory\n");
+    EXPECT_EQ(result.out, version);
+}
+
+TEST_F(options, name_the_line_of_a_sample_file_that_is_refused) {
+    const std::string path = testing::TempDir() + "samples-" + std::to_string(::getpid());
+    const std::string valid = "accel,x=1,y=2,z=3,sampleid=0,timestamp=5,temperature=2880";
+    const std::string no_number =
+        " is no number; expected decimal digits, or 0x and hexadecimal ones";
+    const std::string expand = " is compressed; expand it with ";
+    for (const auto& [text, message] : rows<std::string, std::string>{
+             {valid + "\n# c\n\n" + valid + ",x=1z\n", ":4: \"1z\"" + no_number},
+             {valid + "\n" + valid + "\ngyro,x=1",
+              ":3: a number is missing; expected decimal digits, or 0x and hexadecimal ones"},
+             {valid + ",shake=1", ":1: a shake cannot be played back; remove the line"},
+             {valid + "\n" + valid + "\n" + valid + "\naccel,x",
+              ":4: a field is not KEY=VALUE; expected SERVICE,KEY=VALUE,..."},
+             {"", " contains no samples; expected lines SERVICE,KEY=VALUE,..."},
+             {"# only\nfoo,x=1\n", " contains no samples; expected lines SERVICE,KEY=VALUE,..."},
+             {"\x1f\x8b\x08,", expand + "gunzip"},
+             {"BZh9", expand + "bunzip2"},
+             {std::string("\xfd\x37zXZ\0", 6), expand + "unxz"},
+             {"\x28\xb5\x2f\xfd", expand + "unzstd"},
+             {"PK\3\4", expand + "unzip"},
+             {std::string("a\0", 2), " is not text"},
+         }) {
+        std::ofstream(path) << text;
+        const auto result = run("--replay load " + path + " --version");
+        EXPECT_EQ(result.status, 1) << message;
+        EXPECT_TRUE(result.err.ends_with("nrxctl: " + path + message + "\n")) << result.err;
+        // A number that is refused ends the run; anything else, the option.
+        const bool ends = message.find("number") != std::string::npos ||
+                          message.find("shake") != std::string::npos;
+        EXPECT_EQ(result.out.ends_with(version), !ends);
+    }
+    std::remove(path.c_str());
+    EXPECT_TRUE(
+        run("--replay load " + path)
+            .err.ends_with("nrxctl: " + path + " cannot be read: No such file or directory\n"));
+    EXPECT_TRUE(run("--replay load /").err.ends_with("nrxctl: / cannot be read: Is a directory\n"));
+    EXPECT_EQ(host.log().end(),
+              std::find_if(host.log().begin(), host.log().end(), [](const std::string& line) {
+                  return line.starts_with("call NRXAppClient 0");
+              }));
+}
+
 TEST_F(options, generate_samples_and_play_them_back) {
     const std::string path = testing::TempDir() + "walk-" + std::to_string(::getpid()) + ".txt";
     std::ofstream(path) << run("--replay generate accel sin 10000 1hz").out;
     const auto result = run("--replay load " + path +
-                            " last sram left --replay schedule-enable 5 accel "
+                            " last sram --replay schedule-enable 5 accel "
                             "--replay get-status");
     std::remove(path.c_str());
     EXPECT_EQ(result.status, 0);

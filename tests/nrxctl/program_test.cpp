@@ -2,10 +2,12 @@
 #include "tests/support/program.h"
 
 #include <algorithm>
+#include <array>
 #include <csignal>
 #include <cstdio>
 #include <ctime>
 #include <fcntl.h>
+#include <sys/resource.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -21,7 +23,7 @@ namespace {
 using namespace tests;
 
 const std::string program = NRXCTL_PROGRAM;
-const std::string version = "nrxctl " NRXCTL_VERSION "\n";
+const std::string version = "nrxctl " NRXCTL_VERSION "\nhost: virtual NRX, embedded\n";
 
 // Runs the program on arguments with a space between them.
 program_result run(const std::string& arguments, output_target target = output_target::pipe) {
@@ -31,7 +33,7 @@ program_result run(const std::string& arguments, output_target target = output_t
 TEST(nrxctl_program, ends_with_the_status_of_its_options) {
     EXPECT_EQ(run("--version").status, 0);
     EXPECT_EQ(run("--report nobody 1 --version").status, 1);
-    EXPECT_EQ(run("--mca On").status, 1);
+    EXPECT_EQ(run("--mca On").status, 2);
     EXPECT_EQ(run("--version --foo").status, 2);
 }
 
@@ -74,24 +76,59 @@ TEST(nrxctl_program, measures_events_on_the_clocks_of_the_host) {
     EXPECT_NEAR(wall, static_cast<double>(std::time(nullptr)), 10);
 }
 
+// A watch and what it prints first; the end of its output in order.
+struct watch_row {
+    std::string arguments;
+    std::string awaited;
+    std::string end;
+};
+
+const std::string id_line = "Found an id for service = 16\n";
+const std::vector<watch_row> watches{
+    {"--profile monitor", "(humanReadable=disabled)\n", "\ndone\n"},
+    {"--profile auto sensor:accel:data", "prof-event 02020002", "\ndone\n"},
+    {"--scm auto scm:smb0", "smb0.", "\ndone\n"},
+    {"--spi-status 0x10 0xffffffff", id_line, id_line},
+    {"--events --version", "ResetCallback ", "\n" + version},
+};
+
 TEST(nrxctl_program, waits_without_using_the_processor_and_ends_in_order) {
-    const std::string id_line = "Found an id for service = 16\n";
-    for (const auto& [arguments, awaited, end] : rows<std::string, std::string, std::string>{
-             {"--profile 300 sensor:accel:data", "", "\ndone\n"},  // ends by itself
-             {"--profile monitor", "(humanReadable=disabled)\n", "\ndone\n"},
-             {"--profile auto sensor:accel:data", "prof-event 02020002", "\ndone\n"},
-             {"--spi-status 0x10 0xffffffff", id_line, id_line},
-             {"--events --version", "ResetCallback ", "\n" + version},
-         }) {
+    std::size_t number = 0;
+    for (const auto& [arguments, awaited, end] : watches) {
         running_program watch(program, split(arguments));
-        if (!awaited.empty()) {
-            ASSERT_TRUE(watch.wait_for(awaited)) << arguments;
-            watch.send_interrupt();
-        }
+        ASSERT_TRUE(watch.wait_for(awaited)) << arguments;
+        watch.send_signal(std::array{SIGINT, SIGTERM, SIGHUP}.at(number++ % 3));
         EXPECT_EQ(watch.finish(), 0) << arguments;
         EXPECT_TRUE(watch.out().ends_with(end)) << arguments;
         EXPECT_LT(watch.processor_time(), 0.1) << arguments;
     }
+    running_program ends_by_itself(program, split("--profile 300 sensor:accel:data"));
+    EXPECT_EQ(ends_by_itself.finish(), 0);
+    EXPECT_TRUE(ends_by_itself.out().ends_with("\ndone\n"));
+    EXPECT_LT(ends_by_itself.processor_time(), 0.1);
+}
+
+// Also while it waits for something to print.
+TEST(nrxctl_program, ends_a_watch_when_its_reader_goes_away) {
+    for (const auto& [arguments, awaited, end] : watches) {
+        running_program watch(program, split(arguments));
+        ASSERT_TRUE(watch.wait_for(awaited)) << arguments;
+        watch.stop_reading();
+        EXPECT_EQ(watch.finish(), 0) << arguments;
+        EXPECT_LT(watch.processor_time(), 0.1) << arguments;
+    }
+}
+
+TEST(nrxctl_program, leaves_a_hang_up_ignored_that_it_was_started_to_ignore) {
+    std::signal(SIGHUP, SIG_IGN);
+    running_program watch(program, split("--events --version"));
+    std::signal(SIGHUP, SIG_DFL);
+    ASSERT_TRUE(watch.wait_for("ResetCallback "));
+    watch.send_signal(SIGHUP);
+    const std::size_t size = watch.out().size();
+    EXPECT_TRUE(watch.wait_for("[accelerometer]", size));
+    watch.send_signal(SIGINT);
+    EXPECT_EQ(watch.finish(), 0);
 }
 
 TEST(nrxctl_program, is_ended_by_an_interrupt_after_a_watch) {
@@ -101,7 +138,7 @@ TEST(nrxctl_program, is_ended_by_an_interrupt_after_a_watch) {
     const int writer = ::open(path.c_str(), O_RDWR | O_CLOEXEC);
     running_program blocked(program, split("--events 0 --version --replay load " + path));
     ASSERT_TRUE(blocked.wait_for(version));
-    blocked.send_interrupt();
+    blocked.send_signal(SIGINT);
     blocked.wait_for("more");  // returns when the program ends
     ::close(writer);
     EXPECT_EQ(blocked.finish(), 128 + SIGINT);
@@ -109,16 +146,30 @@ TEST(nrxctl_program, is_ended_by_an_interrupt_after_a_watch) {
 }
 
 // Generating four billion lines would take hours.
-TEST(nrxctl_program, continues_without_a_reader_unless_it_only_generates) {
-    for (const auto target :
-         {output_target::closed_pipe, output_target::full_device, output_target::closed}) {
-        for (const char* arguments :
-             {"--profile human 60 sensor:accel", "--replay generate accel sin 1 -1"}) {
+TEST(nrxctl_program, fails_if_output_is_lost_but_not_without_a_reader) {
+    for (const auto& [target, status] : rows<output_target, int>{{output_target::closed_pipe, 0},
+                                                                 {output_target::full_device, 1},
+                                                                 {output_target::closed, 1}}) {
+        for (const char* arguments : {"--list", "--profile human 60 sensor:accel",
+                                      "--replay generate accel sin 1 4294967295"}) {
             const auto result = run(arguments, target);
-            EXPECT_EQ(result.status, 0) << arguments;
+            EXPECT_EQ(result.status, status) << arguments;
             EXPECT_EQ(result.err, "") << arguments;
         }
     }
+}
+
+// The profiler is disabled in order all the same.
+TEST(nrxctl_program, fails_beyond_the_limit_of_a_files_size) {
+    const rlimit limit{.rlim_cur = 512, .rlim_max = RLIM_INFINITY};
+    rlimit previous{};
+    ::getrlimit(RLIMIT_FSIZE, &previous);
+    ::setrlimit(RLIMIT_FSIZE, &limit);
+    const auto result = run("--profile 200 sensor:accel:data --sensor nosuch", output_target::file);
+    ::setrlimit(RLIMIT_FSIZE, &previous);
+    EXPECT_EQ(result.status, 1);
+    EXPECT_EQ(result.out.size(), 512U);
+    EXPECT_EQ(result.err, "nrxctl: no service \"nosuch\"; --list shows all\n");
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 #include <array>
 #include <fcntl.h>
 #include <future>
+#include <sys/mman.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -53,6 +54,10 @@ pipe_ends open_target(output_target target) {
     switch (target) {
         case output_target::pipe:
             return make_pipe();
+        case output_target::file: {
+            const int file = ::memfd_create("output", MFD_CLOEXEC);
+            return {file, file};
+        }
         case output_target::closed_pipe: {
             const pipe_ends ends = make_pipe();
             ::close(ends.read_end);
@@ -90,9 +95,14 @@ program_result run_program(const std::string& path, const std::vector<std::strin
     const pipe_ends out = open_target(target);
     const pipe_ends err = make_pipe();
     const pid_t child = start_program(path, arguments, out.write_end, err.write_end);
-    if (out.write_end >= 0) ::close(out.write_end);
+    const bool is_file = target == output_target::file;
+    if (out.write_end >= 0 && !is_file) ::close(out.write_end);
     ::close(err.write_end);
     auto errors = std::async(std::launch::async, [&] { return joined(read_pieces(err.read_end)); });
+    if (is_file) {
+        errors.wait();  // until the program ends
+        ::lseek(out.read_end, 0, SEEK_SET);
+    }
     std::string text;
     if (out.read_end >= 0) text = joined(read_pieces(out.read_end));
     const std::string error_text = errors.get();

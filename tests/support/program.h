@@ -14,7 +14,7 @@ struct program_result {
 };
 
 // Where a program's standard output goes.
-enum class output_target { pipe, closed_pipe, full_device, closed };
+enum class output_target { pipe, file, closed_pipe, full_device, closed };
 
 // Starts the program with descriptors for its output; a negative one closes the stream. Returns the
 // process id.

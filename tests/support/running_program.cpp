@@ -8,6 +8,7 @@
 #include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
+#include <utility>
 
 #include "tests/support/program.h"
 
@@ -47,9 +48,9 @@ bool running_program::read_more() {
     return count > 0;
 }
 
-bool running_program::wait_for(const std::string& text) {
+bool running_program::wait_for(const std::string& text, std::size_t position) {
     const auto deadline = std::chrono::steady_clock::now() + std::chrono::seconds(10);
-    while (out_.find(text) == std::string::npos) {
+    while (out_.find(text, position) == std::string::npos) {
         const auto remaining = std::chrono::duration_cast<std::chrono::milliseconds>(
             deadline - std::chrono::steady_clock::now());
         pollfd readable{output_, POLLIN, 0};
@@ -61,8 +62,12 @@ bool running_program::wait_for(const std::string& text) {
     return true;
 }
 
-void running_program::send_interrupt() const {
-    ::kill(child_, SIGINT);
+void running_program::send_signal(int signal) const {
+    ::kill(child_, signal);
+}
+
+void running_program::stop_reading() {
+    ::close(std::exchange(output_, -1));
 }
 
 int running_program::finish() {

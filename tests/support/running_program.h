@@ -16,11 +16,14 @@ public:
     running_program(const running_program&) = delete;
     running_program& operator=(const running_program&) = delete;
 
-    // Reads until the output contains the text. Returns false if the output ends or 10 seconds
-    // pass before that.
-    bool wait_for(const std::string& text);
+    // Reads until the output contains the text after a position. Returns false if the output ends
+    // or 10 seconds pass before that.
+    bool wait_for(const std::string& text, std::size_t position = 0);
 
-    void send_interrupt() const;
+    void send_signal(int signal) const;
+
+    // Closes the pipe: nobody reads the output any more.
+    void stop_reading();
 
     // Reads the rest of the output and waits for the end. Returns the exit status, or 128 + the
     // signal that ended the process.
