@@ -5,7 +5,8 @@
 
 namespace platform {
 
-// Says in a few words which host and device answer, for people: "virtual NRX, embedded".
+// Returns a short description of the host and its device, for people, such as "virtual NRX,
+// embedded".
 std::string host_description();
 
 }  // namespace platform

@@ -1,4 +1,4 @@
-// The interrupt signal inside the virtual host.
+// Interrupts inside the virtual host.
 #pragma once
 
 #include <chrono>
