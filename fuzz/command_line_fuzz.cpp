@@ -1,5 +1,5 @@
 // The arguments of nrxctl, one per line. A command line that is refused has made no call of the
-// platform; one that is accepted runs on a device that answers nothing, and leaves nothing open.
+// platform; one that is accepted runs on a host without services, and leaves nothing open.
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
@@ -14,9 +14,9 @@
 
 namespace {
 
-constexpr int usage_error_status = 2;
+using nrx::nrxctl::usage_error_status;
 
-// Generating samples could take hours, and a sample file could be any device.
+// Generating samples could take hours, and a path could name a device file that blocks.
 bool is_tame(std::string_view argument) {
     return argument != "generate" && argument != "load";
 }

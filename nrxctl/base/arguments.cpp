@@ -41,15 +41,14 @@ arguments_check check_subcommand(const subcommand_row& subcommand, argument_curs
     if (subcommand.check != nullptr) {
         const arguments_check result = subcommand.check(arguments);
         if (result != arguments_check::accepted) return result;
-        if (!excess) excess = arguments.next();  // one that the order of the others leaves unread
+        if (!excess) excess = arguments.next();  // such as "human" in "monitor 1 human"
     }
     if (!excess) return arguments_check::accepted;
     explain([&] {
-        return explanation{
-            "unexpected argument " + quoted(*excess) + " after " + std::string(subcommand.keyword),
-            ""};
+        return explanation{"unexpected argument " + quoted(*excess) + " after " +
+                           std::string(subcommand.keyword)};
     });
-    return arguments_check::misused;
+    return arguments_check::usage_error;
 }
 
 void reject_argument(std::string_view message, std::string_view argument) {

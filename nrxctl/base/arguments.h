@@ -27,7 +27,7 @@ public:
     // The argument that the n-th call of next() from now returns, from 0; nullopt if there is none.
     [[nodiscard]] std::optional<std::string_view> peek(std::size_t n) const;
 
-    // Puts an argument in front of the remaining ones, such as the option's own.
+    // Puts one argument in front of the remaining ones, such as the option's own argument.
     void prepend(std::string_view argument) { prepended_ = argument; }
 
 private:
@@ -47,16 +47,16 @@ auto find_keyword(const Table& table, std::string_view argument) -> decltype(tab
 // What a check of arguments found.
 enum class arguments_check {
     accepted,
-    refused,  // the messages have been written that a run would write
-    misused,  // a run would ignore or misread an argument; an explanation has been given
+    refused,      // the messages have been written that a run would write
+    usage_error,  // a run would ignore or misread an argument; an explanation has been given
 };
+
+inline constexpr std::size_t unlimited_arguments = std::numeric_limits<std::size_t>::max();
 
 // A subcommand of a command family.
 struct subcommand_row {
-    static constexpr std::size_t any_number = std::numeric_limits<std::size_t>::max();
-
     std::string_view keyword;
-    // Reads its own arguments and reports its own failures. Ignores arguments beyond the maximum.
+    // Reads its own arguments and reports its own failures. Leaves those beyond the maximum.
     void (*run)(argument_cursor& arguments);
     std::size_t max_arguments = 0;
     // Reads the arguments as run does, with the same messages, but does nothing else. Null if there
@@ -71,8 +71,8 @@ bool run_subcommand(std::span<const subcommand_row> table, std::string_view keyw
 // Checks the arguments of a subcommand: none may be left unread, or be one too many.
 arguments_check check_subcommand(const subcommand_row& subcommand, argument_cursor& arguments);
 
-// accepted or refused.
-constexpr arguments_check checked(bool accepted) {
+// Returns accepted or refused.
+constexpr arguments_check accepted_if(bool accepted) {
     return accepted ? arguments_check::accepted : arguments_check::refused;
 }
 

@@ -5,6 +5,8 @@
 #include <numeric>
 #include <utility>
 
+#include "nrxctl/base/text_line.h"
+
 namespace nrx {
 
 namespace {
@@ -12,7 +14,7 @@ namespace {
 explanation_list* current_list = nullptr;
 const explanation_scope* innermost_scope = nullptr;
 
-// The number of characters to insert, remove or replace to turn one word into the other.
+// The number of characters to insert, remove or replace to turn one text into the other.
 std::size_t edit_distance(std::string_view a, std::string_view b) {
     std::vector<std::size_t> row(b.size() + 1);
     std::iota(row.begin(), row.end(), std::size_t{0});
@@ -24,7 +26,7 @@ std::size_t edit_distance(std::string_view a, std::string_view b) {
             row[j + 1] = std::min({replaced, diagonal + 1, row[j] + 1});
         }
     }
-    return row.back();
+    return row[b.size()];
 }
 
 }  // namespace
@@ -61,7 +63,7 @@ void explanation_scope::apply(explanation& given) const {
 }
 
 bool explanations_wanted() {
-    return current_list != nullptr;
+    return current_list != nullptr && !current_list->is_full();
 }
 
 void add_explanation(explanation given) {
@@ -69,11 +71,13 @@ void add_explanation(explanation given) {
     current_list->add(given);
 }
 
-std::string_view most_similar(std::string_view word, std::span<const std::string_view> candidates) {
+std::string_view most_similar(std::string_view argument,
+                              std::span<const std::string_view> candidates) {
     std::string_view best;
-    std::size_t best_distance = 1 + word.size() / 3;  // the largest distance of a similar word
+    std::size_t best_distance =
+        1 + argument.size() / 3;  // the largest distance of a similar argument
     for (const std::string_view candidate : candidates) {
-        const std::size_t distance = edit_distance(word, candidate);
+        const std::size_t distance = edit_distance(argument, candidate);
         if (distance >= candidate.size() || distance > best_distance) continue;
         if (!best.empty() && distance == best_distance) continue;
         best = candidate;
@@ -83,22 +87,33 @@ std::string_view most_similar(std::string_view word, std::span<const std::string
 }
 
 std::string quoted(std::string_view text) {
-    return std::string("\"").append(text).append("\"");
+    text_line line;
+    line.text("\"");
+    for (const char& character : text) {
+        const auto code = static_cast<unsigned char>(character);
+        if (code < ' ' || code == 0x7f) {
+            line.text("\\x").zero_padded_hex(code, 2);
+        } else {
+            line.text({&character, 1});
+        }
+    }
+    return std::string(line.text("\"").view());
 }
 
-std::string suggestion(std::string_view word, std::span<const std::string_view> keywords) {
-    const std::string_view similar = most_similar(word, keywords);
-    return similar.empty() ? std::string()
-                           : std::string(" (did you mean ").append(similar).append("?)");
+std::string suggestion(std::string_view argument, std::span<const std::string_view> keywords,
+                       std::string_view prefix) {
+    const std::string_view similar = most_similar(argument, keywords);
+    if (similar.empty()) return {};
+    return std::string(" (did you mean ").append(prefix).append(similar).append("?)");
 }
 
-explanation unknown_keyword(std::string_view kind, std::string_view word, std::string_view expected,
-                            std::span<const std::string_view> keywords) {
-    explanation text{std::string("unknown ").append(kind).append(" ").append(quoted(word)),
+explanation unknown_keyword(std::string_view kind, std::string_view argument,
+                            std::string_view expected, std::span<const std::string_view> keywords) {
+    explanation text{std::string("unknown ").append(kind).append(" ").append(quoted(argument)),
                      std::string(expected).append(":")};
     for (const std::string_view keyword : keywords)
         text.expected.append(" ").append(keyword);
-    text.expected.append(suggestion(word, keywords));
+    text.expected.append(suggestion(argument, keywords));
     return text;
 }
 

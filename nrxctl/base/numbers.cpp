@@ -14,7 +14,8 @@ namespace nrx {
 namespace {
 
 explanation out_of_range(std::string_view argument, std::uint32_t max) {
-    return {quoted(argument) + " is out of range", "expected 0 to " + std::to_string(max)};
+    return {quoted(argument) + " is out of range",
+            "expected a number from 0 to " + std::to_string(max)};
 }
 
 }  // namespace
@@ -45,18 +46,21 @@ std::optional<std::uint32_t> read_number_up_to(std::uint32_t max, std::string_vi
     return static_cast<std::uint32_t>(*number);
 }
 
-std::int64_t parse_number(std::string_view argument, std::string_view message) {
-    const auto number = read_number(argument);
-    if (number) return *number;
+void reject_number(std::string_view argument, std::string_view message) {
     explain([&] {
-        return explanation{
-            argument.empty() ? "a number is missing" : quoted(argument) + " is no number",
-            "expected decimal digits, or 0x and hexadecimal ones"};
+        return explanation{quoted(argument) + " is not a number",
+                           "expected decimal digits, or 0x and hexadecimal ones"};
     });
     reject_argument(message, argument);
 }
 
-bool is_32_bit_number(std::string_view argument) {
+std::int64_t parse_number(std::string_view argument, std::string_view message) {
+    const auto number = read_number(argument);
+    if (!number) reject_number(argument, message);
+    return *number;
+}
+
+bool check_32_bit_number(std::string_view argument) {
     constexpr auto max = std::numeric_limits<std::uint32_t>::max();
     if (read_number_up_to(max, argument)) return true;
     explain([&] { return out_of_range(argument, max); });

@@ -47,14 +47,17 @@ std::optional<std::uint32_t> read_number_up_to(std::uint32_t max, std::string_vi
 // process with status 1 after "message (argument)" as a line on standard output.
 std::int64_t parse_number(std::string_view argument, std::string_view message);
 
+// Rejects an argument that is not a number, as parse_number does.
+[[noreturn]] void reject_number(std::string_view argument, std::string_view message);
+
 // Returns the low 32 bits of the value of parse_number.
 inline std::uint32_t parse_low_32_bits(std::string_view argument, std::string_view message) {
     return static_cast<std::uint32_t>(parse_number(argument, message));
 }
 
-// Returns true if an argument is a number of 32 bits without a sign; otherwise explains that it is
-// not. For an argument of which only the low 32 bits count.
-bool is_32_bit_number(std::string_view argument);
+// Returns true if an argument is a number from 0 to 4294967295; otherwise explains that it is out
+// of range. For an argument of which only the low 32 bits count.
+bool check_32_bit_number(std::string_view argument);
 
 // Returns a number from 0 to max. Rejects any other argument as parse_number does.
 std::uint32_t parse_number_up_to(std::uint32_t max, std::string_view argument,

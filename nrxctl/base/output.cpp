@@ -3,6 +3,7 @@
 #include <cerrno>
 #include <csignal>
 #include <poll.h>
+#include <system_error>
 #include <unistd.h>
 
 #include "nrxctl/base/text_line.h"
@@ -24,25 +25,28 @@ line_sink*& installed(standard_stream stream) {
     return stream == standard_stream::output ? output_sink : error_sink;
 }
 
-// Returns true if a failed write should be retried: after a signal, or when a full pipe can take
-// more.
-bool can_retry(int descriptor) {
-    if (errno == EINTR) return true;
-    if (errno != EAGAIN) return false;
+// Waits until a failed write can be retried: not at all after a signal, otherwise until a full pipe
+// accepts more. Returns false if the error is final, or after an interrupt.
+bool wait_to_retry(int descriptor, int error) {
+    if (platform::interrupt_received()) return false;
+    if (error == EINTR) return true;
+    if (error != EAGAIN) return false;
     pollfd writable{descriptor, POLLOUT, 0};
     return ::poll(&writable, 1, -1) > 0 || errno == EINTR;
 }
 
-bool write_all(int descriptor, std::string_view text) {
+// Returns 0, or the code of the operating system.
+int write_all(int descriptor, std::string_view text) {
     while (!text.empty()) {
         const ssize_t written = ::write(descriptor, text.data(), text.size());
+        const int error = written == 0 ? EIO : errno;
         if (written > 0) {
             text.remove_prefix(static_cast<std::size_t>(written));
-        } else if (written == 0 || !can_retry(descriptor)) {
-            return false;
+        } else if (!wait_to_retry(descriptor, error)) {
+            return error;
         }
     }
-    return true;
+    return 0;
 }
 
 // Returns true for a character that a terminal may act upon: C0 controls but tab and line feed,
@@ -83,10 +87,16 @@ std::string escape_controls(std::string_view text) {
 
 }  // namespace
 
+bool line_sink::reader_gone() const {
+    return error() == EPIPE || error() == ECONNRESET;
+}
+
 bool descriptor_sink::write(std::string_view text) {
-    const bool written = write_all(descriptor_, text);
-    if (!written) reader_gone_ = errno == EPIPE || errno == ECONNRESET;
-    return note_result(written);
+    const bool given_up = error_ == EINTR || error_ == EAGAIN;
+    if (given_up) return false;
+    const int error = write_all(descriptor_, text);
+    if (error != 0) error_ = error;
+    return note_result(error == 0);
 }
 
 bool terminal_sink::write(std::string_view text) {
@@ -170,9 +180,12 @@ void flush_output() {
     output_sink->flush();
 }
 
-bool output_lost() {
-    const auto lost = [](const line_sink& sink) { return sink.failed() && !sink.reader_gone(); };
-    return lost(*output_sink) || lost(*error_sink);
+std::optional<std::string> lost_output() {
+    for (const line_sink* sink : {output_sink, error_sink}) {
+        if (sink->failed() && !sink->reader_gone())
+            return std::system_category().message(sink->error());
+    }
+    return std::nullopt;
 }
 
 }  // namespace nrx

@@ -33,8 +33,11 @@ public:
     // Returns true if any text was lost so far.
     [[nodiscard]] bool failed() const { return failed_; }
 
+    // The operating system's code for the loss; 0 if nothing was lost or there is no code.
+    [[nodiscard]] virtual int error() const { return 0; }
+
     // Returns true if text was lost because nobody reads it any more.
-    [[nodiscard]] virtual bool reader_gone() const { return false; }
+    [[nodiscard]] bool reader_gone() const;
 
 protected:
     // Remembers a failure. Returns written.
@@ -47,16 +50,17 @@ private:
     bool failed_ = false;
 };
 
-// Writes to a file descriptor, which it does not own, one write per call.
+// Writes to a file descriptor, which it does not own, one write per call. An interrupt ends a write
+// that blocks because nobody reads; everything after it is lost.
 class descriptor_sink final : public line_sink {
 public:
     constexpr explicit descriptor_sink(int descriptor) : descriptor_(descriptor) {}
     bool write(std::string_view text) override;
-    [[nodiscard]] bool reader_gone() const override { return reader_gone_; }
+    [[nodiscard]] int error() const override { return error_; }
 
 private:
     int descriptor_;
-    bool reader_gone_ = false;
+    int error_ = 0;
 };
 
 // Makes text from a device safe for a terminal: writes control characters (but tab and line feed)
@@ -67,7 +71,7 @@ public:
     explicit terminal_sink(line_sink& target) : target_(target) {}
     bool write(std::string_view text) override;
     bool flush() override { return note_result(target_.flush()); }
-    [[nodiscard]] bool reader_gone() const override { return target_.reader_gone(); }
+    [[nodiscard]] int error() const override { return target_.error(); }
 
 private:
     line_sink& target_;
@@ -85,7 +89,7 @@ public:
 
     bool write(std::string_view text) override;
     bool flush() override;
-    [[nodiscard]] bool reader_gone() const override { return target_.reader_gone(); }
+    [[nodiscard]] int error() const override { return target_.error(); }
 
 private:
     bool write_buffer();
@@ -170,8 +174,8 @@ void write_error(std::string_view text);
 // Writes buffered standard output. Call it before waiting for anything.
 void flush_output();
 
-// Returns true if the installed sink of either stream has lost text that somebody may have wanted:
-// it could not be written, and not because the reader has gone away.
-bool output_lost();
+// Returns why either stream has lost text that somebody may have wanted, as a text of the operating
+// system; nullopt if nothing was lost, or only because the reader has gone away.
+std::optional<std::string> lost_output();
 
 }  // namespace nrx

@@ -41,18 +41,18 @@ std::int32_t parse_value(std::string_view argument) {
             return static_cast<std::int32_t>(value);
     }
     explain([&] {
-        return explanation{quoted(argument) + " is no value",
+        return explanation{quoted(argument) + " is not a value",
                            "expected hexadecimal digits up to 7fffffff, or 0d and decimal ones"};
     });
     reject_argument("payload value is invalid", argument);
 }
 
 // Rejects a value that is too large for the width. A negative one widens to a huge number.
-void check_width(std::int64_t value, std::uint64_t max_value) {
+void check_width(std::string_view argument, std::int64_t value, std::uint64_t max_value) {
     const auto widened = static_cast<std::uint64_t>(value);
     if (widened <= max_value) return;
     explain([&] {
-        return explanation{std::to_string(value) + " does not fit the width of the values",
+        return explanation{quoted(argument) + " does not fit the width of the values",
                            "u8, u16 or u32 before the first one sets it"};
     });
     text_line line;
@@ -78,7 +78,7 @@ void parse_payload(std::span<char* const> arguments, int& position,
     const std::uint64_t max_value = (std::uint64_t{1} << (8 * width)) - 1;
     for (; position < count && !argument_at(position).starts_with('-'); ++position) {
         const std::int64_t value = parse_value(argument_at(position));
-        check_width(value, max_value);
+        check_width(argument_at(position), value, max_value);
         append_le(payload, static_cast<std::uint64_t>(value), width);
     }
 }

@@ -23,7 +23,7 @@ limited_watch::~limited_watch() {
     remaining.reset();
 }
 
-bool count_printed_event() {
+bool may_print_event() {
     if (!remaining) return true;
     if (*remaining == 0) return false;
     if (--*remaining == 0) platform::request_interrupt();

@@ -20,9 +20,9 @@ public:
     limited_watch& operator=(const limited_watch&) = delete;
 };
 
-// Counts an event or a record that is about to be printed. Returns false if the watch has printed
-// as many as it may; then it must not be printed. The last one interrupts the process, which ends
-// the watch in order. Outside a watch always returns true.
-bool count_printed_event();
+// Counts an event or a record that is about to be printed. Returns false once the limit is reached;
+// the event must then not be printed. The last one interrupts the process; with a handler
+// installed, that ends the watch cleanly. Outside a watch always returns true.
+bool may_print_event();
 
 }  // namespace nrx

@@ -37,7 +37,7 @@ void print_profile_record(const profile_record& record) {
         ++unprintable_records;
         return;
     }
-    if (!count_printed_event()) return;
+    if (!may_print_event()) return;
     line.append(1, [](char* target) {
         *target++ = '\n';
         return target;
@@ -62,7 +62,7 @@ void nrx_profile_hexdump(std::string_view label, platform::byte_view bytes, int 
 }
 
 void dump_profile_record(const profile_record& record) {
-    if (count_printed_event()) nrx_profile_hexdump("prof-event ", record.bytes, 0);
+    if (may_print_event()) nrx_profile_hexdump("prof-event ", record.bytes, 0);
 }
 
 std::uint64_t unprintable_record_count() {

@@ -41,7 +41,7 @@ void scm_packet_printer::print_data(const profile_record& record) const {
     const std::uint16_t length = record.u16(20);
     const std::uint16_t offset = record.u16(22);
     if (length == 0 || record.timestamp() != last_transfer_) return;
-    if (!count_printed_event()) return;
+    if (!may_print_event()) return;
     text_line label;
     label.text(label_).text(":   data[").number(offset).text("-").number(length - 1);
     label.text("/").number(packet_size).text("]: ");
@@ -53,7 +53,7 @@ void scm_packet_printer::print_transfer(const profile_record& record) {
     const short_text* bus = buses.find(record.component());
     const std::string_view* direction = directions.find(record.u32(16));
     if (bus == nullptr || direction == nullptr) return;
-    if (!count_printed_event()) return;
+    if (!may_print_event()) return;
     last_transfer_ = record.timestamp();
     label_.assign(bus->view()).append(".");
     label_.append(std::to_string(record.event()));

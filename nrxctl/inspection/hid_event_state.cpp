@@ -25,7 +25,7 @@ std::ostream& event_stream() {
 }
 
 void end_event_line() {
-    if (count_printed_event()) print_line(line_stream().view());
+    if (may_print_event()) print_line(line_stream().view());
     line_stream().str({});
 }
 

@@ -16,8 +16,8 @@ extern double last_wall_time;
 // that one of them sets applies to all that follow. The text is held until the line ends.
 std::ostream& event_stream();
 
-// Ends the line: writes it on standard output with one write, unless the watch has printed as many
-// as it may.
+// Ends the line: writes it on standard output with one write, unless the watch has reached the
+// limit of print_limit.h.
 void end_event_line();
 
 }  // namespace nrx

@@ -57,7 +57,8 @@ platform::return_code watch_spi_status(service_id id, std::uint32_t mode) {
     print_line(text_line().text("Found an id for service = ").number(id).view());
     const platform::service service = platform::first_match(match_hid_device(id));
     if (!service)
-        explain([&] { return explanation{"no HID device for service " + std::to_string(id), ""}; });
+        explain(
+            [&] { return explanation{"service " + std::to_string(id) + " has no HID device"}; });
     if (!check_step(!!service, condition::service, "Service instance not found"))
         return platform::success;
     const platform::hid_plugin plugin = platform::create_hid_plugin(service);

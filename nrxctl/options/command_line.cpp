@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "nrxctl/base/explanation.h"
+#include "nrxctl/nrxtoollib.h"
 
 namespace nrx::nrxctl {
 
@@ -16,22 +16,19 @@ bool is_option(std::string_view argument) {
     return argument.starts_with(option_prefix);
 }
 
-[[noreturn]] void refuse_ambiguous(std::string_view name, name_list names) {
+usage_error ambiguous_option(std::string_view name, name_list names) {
     usage_error error{std::string(option_prefix).append(name).append(" is ambiguous:")};
     for (const std::string_view candidate : names) {
         if (candidate.starts_with(name))
             error.message.append(" ").append(option_prefix).append(candidate);
     }
-    throw error;
+    return error;
 }
 
-[[noreturn]] void refuse_unknown(std::string_view argument, std::string_view name,
-                                 name_list names) {
-    usage_error error{std::string("unknown option ").append(argument)};
-    const std::string_view similar = most_similar(name, names);
-    if (!similar.empty())
-        error.message.append(" (did you mean ").append(option_prefix).append(similar).append("?)");
-    throw error;
+usage_error unknown_option(std::string_view argument, std::string_view name, name_list names) {
+    return {std::string("unknown option ")
+                .append(argument)
+                .append(suggestion(name, names, option_prefix))};
 }
 
 // Returns the index of the name, or of the only name that begins with it.
@@ -42,8 +39,8 @@ std::size_t find_option(std::string_view argument, std::string_view name, name_l
         return candidate.starts_with(name);
     };
     const auto match = std::find_if(names.begin(), names.end(), abbreviated);
-    if (match == names.end() || name.empty()) refuse_unknown(argument, name, names);
-    if (std::count_if(match, names.end(), abbreviated) > 1) refuse_ambiguous(name, names);
+    if (match == names.end() || name.empty()) throw unknown_option(argument, name, names);
+    if (std::count_if(match, names.end(), abbreviated) > 1) throw ambiguous_option(name, names);
     return static_cast<std::size_t>(match - names.begin());
 }
 
@@ -57,9 +54,9 @@ parsed_option begin_option(char* argument, name_list names) {
     return parsed;
 }
 
-[[noreturn]] void refuse_first(std::string_view argument, name_list names) {
-    if (argument.starts_with('-')) refuse_unknown(argument, argument.substr(1), names);
-    throw usage_error{std::string("expected an option, not ").append(quoted(argument))};
+usage_error not_an_option(std::string_view argument, name_list names) {
+    if (argument.starts_with('-')) return unknown_option(argument, argument.substr(1), names);
+    return {std::string("expected an option, not ").append(quoted(argument))};
 }
 
 }  // namespace
@@ -70,7 +67,7 @@ std::vector<parsed_option> split_command_line(std::span<char* const> arguments, 
         if (is_option(argument)) {
             options.push_back(begin_option(argument, names));
         } else if (options.empty()) {
-            refuse_first(argument, names);
+            throw not_an_option(argument, names);
         } else {
             options.back().arguments.push_back(argument);
         }

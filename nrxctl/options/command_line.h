@@ -24,6 +24,6 @@ struct parsed_option {
 // beginning of one name only; "=" and a first argument may follow directly. Throws usage_error if
 // an argument is no such option, or belongs to none.
 std::vector<parsed_option> split_command_line(std::span<char* const> arguments,
-                                             std::span<const std::string_view> names);
+                                              std::span<const std::string_view> names);
 
 }  // namespace nrx::nrxctl

@@ -14,10 +14,10 @@ namespace nrx::nrxctl {
 namespace {
 
 constexpr std::size_t default_capacity = 65'536;
-constexpr std::uint32_t max_report_capacity = 1 << 20;
+constexpr std::uint32_t max_report_capacity = 1'048'576;
 
 report_id next_report_id(option_arguments& arguments) {
-    return arguments.next_number(std::numeric_limits<std::uint8_t>::max(), "a report id");
+    return arguments.next_number({0, std::numeric_limits<std::uint8_t>::max()}, "a report id");
 }
 
 // Prints a reply as a dump, or writes its bytes.
@@ -26,13 +26,32 @@ void dump_reply(platform::byte_view reply, reply_format format) {
     write_output({reinterpret_cast<const char*>(reply.data()), reply.size()});
 }
 
+// Writes to standard error.
+class error_stream_sink final : public line_sink {
+public:
+    bool write(std::string_view text) override {
+        write_error(text);
+        return true;
+    }
+};
+
+// Makes a call. Its messages on standard output must not get between the bytes of replies.
+template <class Call>
+platform::return_code call_apart(const Call& call, platform::byte_span& reply) {
+    error_stream_sink sink;
+    const scoped_sink installed(standard_stream::output, sink);
+    return call(reply);
+}
+
 // Returns an action that makes a call, which stores a reply in a buffer, and dumps the reply.
 template <class Call>
 option_action dump_action(option_arguments& arguments, Call call) {
     return [call, format = arguments.settings().use_format()] {
         std::vector<std::uint8_t> buffer(default_capacity);
         platform::byte_span reply = buffer;
-        if (call(reply) == platform::success) dump_reply(reply, format);
+        const platform::return_code result =
+            format == reply_format::bytes ? call_apart(call, reply) : call(reply);
+        if (result == platform::success) dump_reply(reply, format);
     };
 }
 
@@ -70,9 +89,9 @@ option_action list(option_arguments& /*arguments*/) {
 option_action read_report(option_arguments& arguments) {
     const std::string_view service = arguments.next();
     const report_id id = next_report_id(arguments);
-    const std::size_t capacity = arguments.at_end()
-                                     ? default_capacity
-                                     : arguments.next_number(max_report_capacity, "a capacity");
+    const std::size_t capacity =
+        arguments.at_end() ? default_capacity
+                           : arguments.next_number({1, max_report_capacity}, "a capacity");
     return [=, format = arguments.settings().use_format()] {
         std::vector<std::uint8_t> buffer(capacity);
         platform::byte_span report = buffer;
@@ -84,7 +103,7 @@ option_action read_report(option_arguments& arguments) {
 option_action write_report(option_arguments& arguments) {
     const std::string_view service = arguments.next();
     const report_id id = next_report_id(arguments);
-    return [=, report = arguments.required_payload()] {
+    return [=, report = arguments.payload()] {
         echo_payload(report_name(service, id), report);
         set_report(service, id, report);
     };
@@ -93,7 +112,7 @@ option_action write_report(option_arguments& arguments) {
 option_action run_command(option_arguments& arguments) {
     const std::string_view service = arguments.next();
     const std::uint32_t code =
-        arguments.next_number(std::numeric_limits<std::uint32_t>::max(), "a command code");
+        arguments.next_number({0, std::numeric_limits<std::uint32_t>::max()}, "a command code");
     return dump_action(arguments, [=, payload = arguments.payload()](platform::byte_span& reply) {
         echo_payload(service, payload);
         return send_command(service, code, payload, reply);
@@ -108,7 +127,7 @@ option_action call_scalar(option_arguments& arguments) {
         const auto scalar = read_number(argument);
         if (!scalar || *scalar < 0)
             throw usage_error{quoted(argument).append(
-                " is no scalar; expected a number from 0 to 9223372036854775807")};
+                " is not a scalar; expected a number from 0 to 9223372036854775807")};
         scalars.push_back(static_cast<std::uint64_t>(*scalar));
     }
     return [=] { call_scalar_method(service, scalars); };
@@ -125,25 +144,24 @@ option_action get_property(option_arguments& arguments) {
 option_action set_property(option_arguments& arguments) {
     const std::string_view service = arguments.next();
     const std::string_view name = arguments.next();
-    return [=, value = arguments.required_payload()] {
+    return [=, value = arguments.payload()] {
         echo_payload(property_name(service, name), value);
         set_named_property(service, name, value);
     };
 }
 
 option_action query_hid_driver(option_arguments& arguments) {
-    return dump_action(arguments,
-                       [input = arguments.required_payload()](platform::byte_span& output) {
-                           echo_payload("the HID driver", input);
-                           return call_hid_driver(input, output);
-                       });
+    return dump_action(arguments, [input = arguments.payload()](platform::byte_span& output) {
+        echo_payload("the HID driver", input);
+        return call_hid_driver(input, output);
+    });
 }
 
 option_action set_mca(option_arguments& arguments) {
     const std::string_view state = arguments.next();
     const bool on = state == "on";
     if (!on && state != "off")
-        throw usage_error{quoted(state).append(" is no state; expected on or off")};
+        throw usage_error{quoted(state).append(" is not a state; expected on or off")};
     return [=] { switch_mca(on); };
 }
 

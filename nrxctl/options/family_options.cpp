@@ -3,7 +3,6 @@
 #include <optional>
 #include <utility>
 
-#include "nrxctl/base/print_limit.h"
 #include "nrxctl/nrxtoollib.h"
 #include "nrxctl/options/option_functions.h"
 
@@ -19,17 +18,13 @@ option_action limited(std::optional<std::uint32_t> count, option_action run) {
     };
 }
 
-// Returns true for "monitor" and for a run, which begins with none of the subcommands.
-bool is_watch(std::string_view subcommand) {
-    return subcommand == "monitor" || find_keyword(profile_subcommands(), subcommand) == nullptr;
-}
-
 }  // namespace
 
 option_action profile(option_arguments& arguments) {
-    const bool watches = is_watch(arguments.peek());
+    const bool is_watch = is_profile_watch(arguments.peek());
     auto run = arguments.family_action({profile_command, check_profile_command});
-    return watches ? limited(arguments.settings().use_count(), std::move(run)) : run;
+    if (!is_watch) return run;
+    return limited(arguments.settings().use_count(), std::move(run));
 }
 
 option_action scm(option_arguments& arguments) {
@@ -45,7 +40,7 @@ option_action show_sensor(option_arguments& arguments) {
     constexpr auto max_level = std::numeric_limits<std::int32_t>::max();
     const std::string_view name = arguments.next();
     const std::uint32_t level =
-        arguments.at_end() ? 1 : arguments.next_number(max_level, "a level");
+        arguments.at_end() ? 1 : arguments.next_number({0, max_level}, "a level");
     return [=] { print_sensor_info(name, static_cast<std::int32_t>(level)); };
 }
 

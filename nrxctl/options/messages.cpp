@@ -2,7 +2,6 @@
 
 #include <unistd.h>
 
-#include "nrxctl/nrxtoollib.h"
 #include "platform/host.h"
 
 namespace nrx::nrxctl {
@@ -15,6 +14,10 @@ bool error_is_terminal() {
 
 }  // namespace
 
+std::string host_line() {
+    return "host: " + platform::host_description();
+}
+
 void print_message(std::string_view text) {
     write_error(text_line().text("nrxctl: ").text(text).text("\n").view());
 }
@@ -25,7 +28,7 @@ void print_explanations(explanation_list& explanations) {
 }
 
 void announce_host() {
-    if (error_is_terminal()) print_message("the host is " + platform::host_description());
+    if (error_is_terminal()) print_message(host_line());
 }
 
 void echo_payload(std::string_view target, platform::byte_view payload) {

@@ -1,12 +1,18 @@
-// What nrxctl itself says on standard error.
+// What nrxctl itself says.
 #pragma once
 
+#include <string>
 #include <string_view>
 
-#include "nrxctl/base/explanation.h"
+#include "nrxctl/nrxtoollib.h"
 #include "platform/bytes.h"
 
 namespace nrx::nrxctl {
+
+// Returns "host: DESCRIPTION".
+std::string host_line();
+
+// The rest goes to standard error.
 
 // Writes "nrxctl: TEXT" as a line.
 void print_message(std::string_view text);

@@ -3,7 +3,6 @@
 #include <optional>
 #include <utility>
 
-#include "nrxctl/base/explanation.h"
 #include "nrxctl/nrxtoollib.h"
 #include "nrxctl/options/messages.h"
 
@@ -14,7 +13,7 @@ namespace {
 // Holds back what is written while it exists.
 class held_output {
 public:
-    // Writes it on the streams that it was meant for.
+    // Writes it on the streams that it was meant for, standard output first.
     void release() {
         installed_output_.reset();
         installed_error_.reset();
@@ -39,13 +38,11 @@ std::string joined(const std::vector<std::string>& texts) {
 }  // namespace
 
 void option_settings::set_count(std::uint32_t count) {
-    check_use();
     count_ = count;
     count_unused_ = true;
 }
 
 void option_settings::set_format(reply_format format, std::string_view option) {
-    check_use();
     format_ = format;
     unused_format_ = option;
 }
@@ -63,39 +60,38 @@ reply_format option_settings::use_format() {
 void option_settings::check_use() const {
     if (count_unused_)
         throw usage_error{
-            "--count must stand before --events, --scm, --spi-status or a run or monitor of "
+            "--count must come before --events, --scm, --spi-status or a run or monitor of "
             "--profile"};
     if (!unused_format_.empty())
         throw usage_error{
             std::string(unused_format_)
-                .append(" must stand before --report, --command, --get-property or --hid-driver")};
+                .append(" must come before --report, --command, --get-property or --hid-driver")};
 }
 
 std::string_view option_arguments::next() {
     return arguments_[static_cast<std::size_t>(index_++)];
 }
 
-std::uint32_t option_arguments::next_number(std::uint32_t max, std::string_view what) {
+std::uint32_t option_arguments::next_number(number_range range, std::string_view kind) {
     const std::string_view argument = next();
-    if (const auto number = read_number_up_to(max, argument)) return *number;
+    const auto number = read_number_up_to(range.max, argument);
+    if (number && *number >= range.min) return *number;
     throw usage_error{quoted(argument)
                           .append(" is not ")
-                          .append(what)
-                          .append("; expected a number from 0 to ")
-                          .append(std::to_string(max))};
-}
-
-std::vector<std::uint8_t> option_arguments::required_payload() {
-    auto payload = this->payload();
-    if (payload.empty()) throw usage_error{"a value is missing"};
-    return payload;
+                          .append(kind)
+                          .append("; expected a number from ")
+                          .append(std::to_string(range.min))
+                          .append(" to ")
+                          .append(std::to_string(range.max))};
 }
 
 std::vector<std::uint8_t> option_arguments::payload() {
+    const bool has_argument = !at_end();
     std::vector<std::uint8_t> payload;
     parse_payload(arguments_, index_, payload);
+    if (has_argument && at_end() && payload.empty()) throw usage_error{"a value is missing"};
     if (!at_end())
-        throw usage_error{quoted(next()).append(" is no value; none begins with a minus sign")};
+        throw usage_error{quoted(next()).append(" is not a value; values cannot be negative")};
     return payload;
 }
 
@@ -104,9 +100,9 @@ option_action option_arguments::family_action(const command_family& family) {
     const int begin = index_;
     explanation_list explanations;
     held_output held;
-    auto result = arguments_check::refused;
+    auto result = arguments_check::refused;  // also if the check ends the process
     run_to_completion([&] { result = family.check(first, arguments_, index_); });
-    if (result == arguments_check::misused) throw usage_error{joined(explanations.take())};
+    if (result == arguments_check::usage_error) throw usage_error{joined(explanations.take())};
     if (result == arguments_check::refused) {
         held.release();
         print_explanations(explanations);

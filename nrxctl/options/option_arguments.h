@@ -9,7 +9,7 @@
 #include <string_view>
 #include <vector>
 
-#include "nrxctl/base/arguments.h"
+#include "nrxctl/nrxtoollib.h"
 #include "nrxctl/options/command_line.h"
 
 namespace nrx::nrxctl {
@@ -27,11 +27,11 @@ public:
     void set_count(std::uint32_t count);
     void set_format(reply_format format, std::string_view option);
 
-    // Return a setting, which has then been of use.
+    // Return a setting, which has then been used.
     std::optional<std::uint32_t> use_count();
     reply_format use_format();
 
-    // Throws usage_error if the latest setting of a kind was of no use.
+    // Throws usage_error if the latest setting of a kind has not been used.
     void check_use() const;
 
 private:
@@ -41,7 +41,13 @@ private:
     std::string_view unused_format_;  // the option that set it
 };
 
-// The arguments of an option, read one by one. What cannot be read throws usage_error.
+struct number_range {
+    std::uint32_t min;
+    std::uint32_t max;
+};
+
+// The arguments of an option, read one by one. What cannot be read throws usage_error. Refers to
+// the arguments and the settings; so do the actions of the options, to the arguments.
 class option_arguments {
 public:
     option_arguments(std::span<char* const> arguments, option_settings& settings)
@@ -58,15 +64,12 @@ public:
     // Returns true if all arguments have been read.
     [[nodiscard]] bool at_end() const { return position() == arguments_.size(); }
 
-    // Reads the next argument as a number from 0 to max. The text says what it is: "a capacity".
-    std::uint32_t next_number(std::uint32_t max, std::string_view what);
+    // Reads the next argument as a number in the range. The kind is named like "a capacity".
+    std::uint32_t next_number(number_range range, std::string_view kind);
 
     // Reads the remaining arguments as a payload (see parse_payload), which is empty if there are
-    // none. May end the process.
+    // none; a width alone is none. May end the process.
     std::vector<std::uint8_t> payload();
-
-    // The same, but there must be a value.
-    std::vector<std::uint8_t> required_payload();
 
     // A command family of the library: a function that reads its own arguments, and one that checks
     // them.
@@ -77,7 +80,8 @@ public:
     };
 
     // Checks all arguments, which belong to a family, and returns the action that runs it. Ends the
-    // process if the library refuses them; throws usage_error if it would ignore or misread some.
+    // process if the library refuses them; throws usage_error if it would ignore or misread
+    // some, such as a second duration or a negative count.
     option_action family_action(const command_family& family);
 
 private:

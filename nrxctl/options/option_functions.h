@@ -6,7 +6,7 @@
 
 namespace nrx::nrxctl {
 
-// Options that make one call of a driver.
+// Options that call drivers.
 option_action list(option_arguments& arguments);
 option_action read_report(option_arguments& arguments);
 option_action write_report(option_arguments& arguments);
@@ -17,7 +17,7 @@ option_action set_property(option_arguments& arguments);
 option_action query_hid_driver(option_arguments& arguments);
 option_action set_mca(option_arguments& arguments);
 
-// Options that run a command family of the library.
+// Options that run a larger part of the library.
 option_action profile(option_arguments& arguments);
 option_action scm(option_arguments& arguments);
 option_action replay(option_arguments& arguments);

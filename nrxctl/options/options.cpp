@@ -2,68 +2,58 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdint>
 #include <cstdlib>
+#include <iterator>
 #include <new>
 #include <string>
 #include <vector>
 
-#include "nrxctl/nrxtoollib.h"
 #include "nrxctl/options/command_line.h"
 #include "nrxctl/options/messages.h"
 #include "nrxctl/options/option_functions.h"
-#include "platform/host.h"
 
 namespace nrx::nrxctl {
 
 namespace {
 
-constexpr int usage_error_status = 2;
-
-constexpr std::size_t any_number = subcommand_row::any_number;
-
 option_action help(option_arguments& arguments);
 option_action version(option_arguments& arguments);
 
 constexpr std::array option_rows{
-    option_row{"profile", "SUBCOMMAND [ARGUMENT...]", 1, any_number,
+    option_row{"profile", "SUBCOMMAND [ARGUMENT...]", 1, unlimited_arguments,
                "control the profiler; the subcommand help shows its usage", profile},
-    option_row{"scm", "DURATION CONFIG...", 1, any_number,
-               "print the coprocessor's bus transfers for milliseconds, or auto", scm},
-    option_row{"replay", "SUBCOMMAND [ARGUMENT...]", 1, any_number,
+    option_row{"scm", "DURATION CONFIG...", 1, unlimited_arguments,
+               "print bus transfers for DURATION milliseconds, or auto", scm},
+    option_row{"replay", "SUBCOMMAND [ARGUMENT...]", 1, unlimited_arguments,
                "play samples back in place of live ones; see the subcommand help", replay},
     option_row{"sensor", "NAME [LEVEL]", 1, 2,
                "print a sensor's configuration; at level 2 also clients and state", show_sensor},
     option_row{"list", "", 0, 0, "list the interface services with their ids", list},
     option_row{"report", "SERVICE ID [CAPACITY]", 2, 3, "read a report and print it", read_report},
-    option_row{"set-report", "SERVICE ID [u8|u16|u32] VALUE...", 3, any_number, "write a report",
-               write_report},
-    option_row{"command", "SERVICE CODE [u8|u16|u32] [VALUE...]", 2, any_number,
+    option_row{"set-report", "SERVICE ID [u8|u16|u32] VALUE...", 3, unlimited_arguments,
+               "write a report", write_report},
+    option_row{"command", "SERVICE CODE [u8|u16|u32] [VALUE...]", 2, unlimited_arguments,
                "send a command and dump its reply", run_command},
-    option_row{"scalar", "SERVICE [SCALAR...]", 1, any_number,
+    option_row{"scalar", "SERVICE [SCALAR...]", 1, unlimited_arguments,
                "call the scalar method of a service", call_scalar},
     option_row{"get-property", "SERVICE NAME", 2, 2, "dump a named property of a service",
                get_property},
-    option_row{"set-property", "SERVICE NAME [u8|u16|u32] VALUE...", 3, any_number,
+    option_row{"set-property", "SERVICE NAME [u8|u16|u32] VALUE...", 3, unlimited_arguments,
                "set a named property of a service", set_property},
-    option_row{"hid-driver", "[u8|u16|u32] VALUE...", 1, any_number,
+    option_row{"hid-driver", "[u8|u16|u32] VALUE...", 1, unlimited_arguments,
                "call the HID driver and dump its reply", query_hid_driver},
     option_row{"mca", "on|off", 1, 1, "switch the MCA", set_mca},
     option_row{"spi-status", "SERVICE MODE", 2, 2,
                "print the SPI status records of a HID device until an interrupt", watch_spi},
-    option_row{"events", "[SECONDS]", 0, 1, "print HID events, for so long or until an interrupt",
+    option_row{"events", "[SECONDS]", 0, 1, "print HID events for SECONDS, or until an interrupt",
                watch_events},
-    option_row{"count", "N", 1, 1, "end the watches that follow after N events or records",
-               set_count},
-    option_row{"hex", "", 0, 0, "dump the replies that follow, whatever printer they have",
-               set_hex},
-    option_row{"raw", "", 0, 0, "write the bytes of the replies that follow", set_raw},
+    option_row{"count", "N", 1, 1, "end each later watch after N events or records", set_count},
+    option_row{"hex", "", 0, 0, "dump the later replies, even if they have a printer", set_hex},
+    option_row{"raw", "", 0, 0, "write the bytes of the later replies", set_raw},
     option_row{"help", "", 0, 0, "print this help", help},
     option_row{"version", "", 0, 0, "print the version and the host", version},
 };
-
-std::string host_line() {
-    return "host: " + platform::host_description();
-}
 
 void print_help() {
     print_line("usage: nrxctl OPTION...");
@@ -121,8 +111,8 @@ std::vector<option_action> read_options(std::span<const parsed_option> options) 
     return actions;
 }
 
-// Records that a watch has not printed are counted at its end.
-void report_unprintable_records(std::uint64_t records) {
+// Says how many records an option has not printed.
+void print_unprintable_count(std::uint64_t records) {
     if (records == 0) return;
     text_line line;
     line.number(records).text(records == 1 ? " record was" : " records were");
@@ -133,7 +123,7 @@ void run_action(const option_action& action) {
     if (!action) return;
     const std::uint64_t unprintable = unprintable_record_count();
     action();
-    report_unprintable_records(unprintable_record_count() - unprintable);
+    print_unprintable_count(unprintable_record_count() - unprintable);
 }
 
 }  // namespace
@@ -156,15 +146,17 @@ int run(int argc, char** argv) {
                 print_explanations(explanations);
             }
         });
+        print_explanations(explanations);
     } catch (const usage_error& error) {
         print_message(error.message + "\nTry nrxctl --help.");
         return usage_error_status;
     } catch (const std::bad_alloc&) {
-        write_error("nrxctl: out of memory\n");
+        write_error("nrxctl: out of memory\n");  // without allocating more
+        return EXIT_FAILURE;
     }
-    print_explanations(explanations);
-    const bool succeeded = completed && failure_count() == failures && !output_lost();
-    return succeeded ? EXIT_SUCCESS : EXIT_FAILURE;
+    const auto loss = lost_output();
+    if (loss) print_message("output was lost: " + *loss);
+    return completed && !loss && failure_count() == failures ? EXIT_SUCCESS : EXIT_FAILURE;
 }
 
 }  // namespace nrx::nrxctl

@@ -18,6 +18,8 @@ struct option_row {
     option_action (*read)(option_arguments& arguments);
 };
 
+inline constexpr int usage_error_status = 2;
+
 // All options.
 std::span<const option_row> option_table();
 

@@ -7,8 +7,7 @@ namespace nrx::nrxctl {
 
 option_action set_count(option_arguments& arguments) {
     constexpr auto max_count = std::numeric_limits<std::uint32_t>::max();
-    const std::uint32_t count = arguments.next_number(max_count, "a count");
-    if (count == 0) throw usage_error{"the count is 0; expected at least 1"};
+    const std::uint32_t count = arguments.next_number({1, max_count}, "a count");
     arguments.settings().set_count(count);
     return {};
 }

@@ -3,7 +3,6 @@
 #include <limits>
 #include <optional>
 
-#include "nrxctl/base/print_limit.h"
 #include "nrxctl/nrxtoollib.h"
 #include "nrxctl/options/option_functions.h"
 #include "platform/clock.h"
@@ -15,8 +14,8 @@ namespace nrx::nrxctl {
 namespace {
 
 // While it exists, an interrupt stops the event loop. Its destructor restores the default action,
-// which ends the process. An interrupt that comes after the loop has ended but before that is not
-// lost: the next option that runs the loop ends at once.
+// which ends the process. An interrupt between the end of the loop and the destructor is kept: it
+// ends the next option that runs the loop at once, as the user asked for the end.
 class loop_interrupt_handler {
 public:
     loop_interrupt_handler() { platform::set_interrupt_handler(platform::stop_loop); }
@@ -40,7 +39,8 @@ option_action watch_events(option_arguments& arguments) {
     std::optional<std::chrono::seconds> duration;
     if (!arguments.at_end()) {
         constexpr auto max_seconds = std::numeric_limits<std::int32_t>::max();
-        duration = std::chrono::seconds(arguments.next_number(max_seconds, "a number of seconds"));
+        duration =
+            std::chrono::seconds(arguments.next_number({0, max_seconds}, "a number of seconds"));
     }
     return [duration, count = arguments.settings().use_count()] {
         set_print_limit(count);
@@ -54,10 +54,13 @@ option_action watch_events(option_arguments& arguments) {
 option_action watch_spi(option_arguments& arguments) {
     const std::string_view service = arguments.next();
     constexpr auto max_mode = std::numeric_limits<std::uint32_t>::max();
-    const std::uint32_t mode = arguments.next_number(max_mode, "a mode");
+    const std::uint32_t mode = arguments.next_number({0, max_mode}, "a mode");
     return [service, mode, count = arguments.settings().use_count()] {
         service_id id{};
         if (!resolve_service_id(service, id)) return count_failure();
+        const explanation_scope scope([&](explanation& given) {
+            given = {quoted(service) + " has no HID device", "--list shows all services"};
+        });
         set_print_limit(count);
         const loop_interrupt_handler handler;
         watch_spi_status(id, mode);

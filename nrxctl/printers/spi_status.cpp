@@ -86,7 +86,7 @@ void print_spi_status(platform::byte_view record) {
     const bool is_status = is_complete_header && type == status_type;
     const std::string_view* heading = headings.find(type);
     if (is_complete_header && !is_status && heading == nullptr) return;
-    if (!count_printed_event()) return;
+    if (!may_print_event()) return;
     if (!check_length(record, is_status ? status_size : header_size)) return hex_dump(record);
     is_status ? print_status(fields) : print_captured(record, *heading);
 }

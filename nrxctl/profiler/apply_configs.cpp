@@ -1,6 +1,7 @@
 #include "nrxctl/profiler/apply_configs.h"
 
 #include "nrxctl/base/check.h"
+#include "nrxctl/base/output.h"
 #include "nrxctl/profiler/fw_profiler.h"
 #include "nrxctl/profiler/kernel_profiler.h"
 
@@ -11,7 +12,7 @@ namespace {
 bool configure_fw(std::span<const profiler_config> configs) {
     const platform::return_code result = send_fw_configs(configs);
     if (result == platform::unsupported) {
-        print_failure("fw config: At least one config failed");
+        print_line("fw config: At least one config failed");
         return true;
     }
     return check_success(result, condition::result_is_zero);
@@ -21,7 +22,7 @@ bool configure_kernel(std::span<const profiler_config> configs) {
     const auto result = send_kernel_configs(configs);
     const bool success = result.has_value();
     if (!check(success, condition::success) || *result == platform::unsupported) {
-        print_failure("kext config: At least one config failed");
+        print_line("kext config: At least one config failed");
         return true;
     }
     return check_success(*result, condition::result_is_zero);

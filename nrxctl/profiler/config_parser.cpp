@@ -45,9 +45,9 @@ std::uint32_t parse_reports(std::span<const keyword_row> keywords, const field_l
 }
 
 explanation unknown_component(const profiler_grammar& profiler, std::string_view component) {
-    const std::string_view numbers = profiler.takes_numeric_components ? " a number or" : "";
-    return unknown_keyword("component", component,
-                           std::string(profiler.keyword).append(" has").append(numbers),
+    const std::string_view expected =
+        profiler.takes_numeric_components ? " takes a number or" : " has";
+    return unknown_keyword("component", component, std::string(profiler.keyword).append(expected),
                            keywords_of(profiler.components));
 }
 
@@ -147,7 +147,7 @@ bool parse_profiler_config(std::string_view argument, std::vector<profiler_confi
     if (profiler->takes_one_component_only &&
         !check_explained(lists.components.size() == 1, "components.size() == 1", [&] {
             return explanation{"not one component",
-                               "each of " + quoted(fields[0]) + " needs an argument of its own"};
+                               std::string(fields[0]) + " takes one for each argument"};
         })) {
         return false;
     }

@@ -27,7 +27,8 @@ bool parse_profiler_config(std::string_view argument, std::vector<profiler_confi
 
 // Sets config to every report and no service of a component. The component "stop" stops the
 // profiler; "stop" as the first report disables the component. Returns false with a failure report
-// if the component is unknown and the profiler takes no numbers for components.
+// if the component is unknown and the profiler takes no numbers for components; if it does, a
+// component that is not a number ends the process.
 bool init_profiler_config(const profiler_grammar& profiler, std::string_view component,
                           std::optional<std::string_view> first_report, profiler_config& config);
 

@@ -45,6 +45,7 @@ const error_action_row* read_error_action(argument_cursor& arguments) {
     if (row != nullptr) return row;
     print_failure(text_line().text("invalid argument: ").text(argument).view());
     explain([&] {
+        if (argument.empty()) return explanation{"on-error needs panic|nothing"};
         return unknown_keyword("action", argument, "expected", keywords_of(error_action_rows));
     });
     return nullptr;
@@ -65,7 +66,7 @@ std::optional<run_args> read_run_args(argument_cursor& arguments) {
     run_args args{parse_monitor_args(arguments), {}};
     const bool human_is_late = arguments.peek(0) == human_keyword;
     const explanation_scope scope([=](explanation& given) {
-        if (human_is_late) given = {"human must stand before the duration", ""};
+        if (human_is_late) given = {"human must come before the duration"};
     });
     return read_configs(arguments, args.configs) ? std::optional(args) : std::nullopt;
 }
@@ -144,16 +145,16 @@ void run_profile(argument_cursor& arguments) {
 }
 
 arguments_check check_error_action(argument_cursor& arguments) {
-    return checked(read_error_action(arguments) != nullptr);
+    return accepted_if(read_error_action(arguments) != nullptr);
 }
 
 arguments_check check_configs(argument_cursor& arguments) {
     if (arguments.remaining() == 0) {
-        explain([] { return explanation{"a configuration is needed, such as sensor:accel", ""}; });
-        return arguments_check::misused;
+        explain([] { return explanation{"config needs CONFIG..., such as sensor:accel"}; });
+        return arguments_check::usage_error;
     }
     std::vector<profiler_config> configs;
-    return checked(read_configs(arguments, configs));
+    return accepted_if(read_configs(arguments, configs));
 }
 
 arguments_check check_monitor(argument_cursor& arguments) {
@@ -162,7 +163,7 @@ arguments_check check_monitor(argument_cursor& arguments) {
 }
 
 arguments_check check_run(argument_cursor& arguments) {
-    return checked(read_run_args(arguments).has_value());
+    return accepted_if(read_run_args(arguments).has_value());
 }
 
 }  // namespace nrx::profile

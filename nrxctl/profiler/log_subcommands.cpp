@@ -71,7 +71,7 @@ void show_logs(argument_cursor& arguments) {
 }
 
 arguments_check check_log_options(argument_cursor& arguments) {
-    return checked(parse_log_options(arguments).has_value());
+    return accepted_if(parse_log_options(arguments).has_value());
 }
 
 }  // namespace nrx::profile

@@ -79,9 +79,9 @@ void print_remaining(const profiler_conn& conn, record_printer print) {
 }  // namespace
 
 std::uint32_t parse_duration(std::string_view argument) {
-    if (argument == "auto") return 0;
+    if (argument == auto_keyword) return 0;
     const explanation_scope scope([&](explanation& given) {
-        given = {quoted(argument) + " is no duration",
+        given = {quoted(argument) + " is not a duration",
                  "expected auto, or milliseconds from 0 to " + std::to_string(max_milliseconds)};
     });
     return parse_number_up_to(max_milliseconds, argument, "duration parameter is invalid") *

@@ -16,8 +16,9 @@ struct monitor_args {
     bool human = false;          // records are printed as text
 };
 
-// The argument that asks for records as text.
+// The arguments that ask for records as text, and for a monitor without end.
 inline constexpr std::string_view human_keyword = "human";
+inline constexpr std::string_view auto_keyword = "auto";
 
 // Returns the duration in microseconds that an argument gives: 0 for "auto", otherwise a number of
 // milliseconds. Any other argument, and a duration beyond 32 bits, ends the process with status 1

@@ -32,8 +32,6 @@ void help(argument_cursor& /*arguments*/) {
         print_line(line);
 }
 
-constexpr auto any_number = subcommand_row::any_number;
-
 constexpr std::array subcommands{
     subcommand_row{"help", help},
     subcommand_row{"clear-eventsources", profile::clear_event_source_statistics},
@@ -44,18 +42,17 @@ constexpr std::array subcommands{
     subcommand_row{"disable", profile::disable},
     subcommand_row{"stop", profile::stop},
     subcommand_row{"flush", profile::flush},
-    subcommand_row{"config", profile::configure, any_number, profile::check_configs},
-    subcommand_row{"set-config", profile::configure, any_number, profile::check_configs},
+    subcommand_row{"config", profile::configure, unlimited_arguments, profile::check_configs},
+    subcommand_row{"set-config", profile::configure, unlimited_arguments, profile::check_configs},
     subcommand_row{"get-config", profile::show_configs},
     subcommand_row{"monitor", profile::monitor, 2, profile::check_monitor},
     subcommand_row{"signal-errdump", profile::signal_error_dump},
-    subcommand_row{"get-logs", profile::show_logs, any_number, profile::check_log_options},
+    subcommand_row{"get-logs", profile::show_logs, unlimited_arguments, profile::check_log_options},
     subcommand_row{"on-error", profile::set_action_on_error, 1, profile::check_error_action},
 };
 
-// An argument that begins a profiling run.
 bool begins_run(std::string_view argument) {
-    return argument == human_keyword || argument == "auto" || read_number(argument);
+    return argument == human_keyword || argument == auto_keyword || read_number(argument);
 }
 
 }  // namespace
@@ -78,12 +75,18 @@ arguments_check check_profile_command(std::string_view subcommand, std::span<cha
     if (const subcommand_row* row = find_keyword(subcommands, subcommand))
         return check_subcommand(*row, cursor);
     cursor.prepend(subcommand);
-    if (begins_run(subcommand)) return profile::check_run(cursor);
+    // What begins no run was probably meant as a subcommand.
     const explanation_scope scope([&](explanation& given) {
+        if (begins_run(subcommand)) return;
         given = unknown_keyword("subcommand", subcommand, "expected a duration or",
                                 keywords_of(subcommands));
     });
     return profile::check_run(cursor);
+}
+
+bool is_profile_watch(std::string_view subcommand) {
+    const subcommand_row* row = find_keyword(subcommands, subcommand);
+    return row == nullptr || row->run == profile::monitor;
 }
 
 }  // namespace nrx

@@ -21,8 +21,12 @@ void profile_command(std::string_view subcommand, std::span<char* const> argumen
 std::span<const subcommand_row> profile_subcommands();
 
 // Reads the arguments as profile_command does, with the same messages, but does nothing else. More
-// arguments than the subcommand takes are misused.
+// arguments than the subcommand takes are a usage error.
 arguments_check check_profile_command(std::string_view subcommand, std::span<char* const> arguments,
                                       int& index);
+
+// Returns true if the subcommand prints records as they arrive: "monitor" and a profiling run,
+// which is anything that is no subcommand.
+bool is_profile_watch(std::string_view subcommand);
 
 }  // namespace nrx

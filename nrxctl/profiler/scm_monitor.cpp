@@ -40,9 +40,8 @@ std::optional<scm_args> read_scm_args(std::string_view duration, argument_cursor
     scm_args args{parse_duration(duration), {}};
     const bool success = parse_profiler_configs(arguments, args.configs);
     if (!check(success, condition::success)) return std::nullopt;
-    if (!check_explained(!args.configs.empty(), "configs.size() != 0", [] {
-            return explanation{"no configuration", "expected one, such as scm:smb0"};
-        })) {
+    if (!check_explained(!args.configs.empty(), "configs.size() != 0",
+                         [] { return explanation{"--scm needs CONFIG..., such as scm:smb0"}; })) {
         return std::nullopt;
     }
     return args;
@@ -76,7 +75,7 @@ void scm_monitor(std::string_view duration, std::span<char* const> arguments, in
 arguments_check check_scm_monitor(std::string_view duration, std::span<char* const> arguments,
                                   int& index) {
     argument_cursor cursor(arguments, index);
-    return checked(read_scm_args(duration, cursor).has_value());
+    return accepted_if(read_scm_args(duration, cursor).has_value());
 }
 
 }  // namespace nrx

@@ -11,7 +11,7 @@ namespace nrx {
 // Configures the coprocessor's half of the profiler as the arguments from index on say, prints the
 // bus transfers and their data for a duration ("auto" or milliseconds), then stops the profiling of
 // transfers. The profiler is enabled for that time, unless a client is connected already. All
-// arguments are read, unless the coprocessor has no profiler.
+// arguments are read, unless the coprocessor has no profiler or the driver's status cannot be read.
 //
 // Every failure is reported; there is no result. An invalid number ends the process with status 1.
 // While the monitor runs, an interrupt asks the driver to end the stream of events. Set tick_period

@@ -1,6 +1,7 @@
 #include "nrxctl/replay/generate_samples.h"
 
 #include <string>
+#include <vector>
 
 #include "nrxctl/base/check.h"
 #include "nrxctl/base/explanation.h"
@@ -20,11 +21,33 @@ bool is_frequency(std::string_view argument) {
     return argument.size() > unit_length && (argument.ends_with("hz") || argument.ends_with("Hz"));
 }
 
+std::string_view without_unit(std::string_view argument) {
+    if (is_frequency(argument)) argument.remove_suffix(unit_length);
+    return argument;
+}
+
+// Returns true if an argument is a number that is not used as it is, with an explanation.
+bool drops_bits(std::string_view argument) {
+    return read_number(argument) && !check_32_bit_number(argument);
+}
+
+explanation no_sample_in_period() {
+    return {"a period contains no sample", "expected a shorter interval or a lower frequency"};
+}
+
+// Returns true if a period contains a sample, also if more than 32 bits are used to compute it.
+bool has_whole_period(std::string_view interval, std::string_view hz) {
+    const auto product = static_cast<std::uint64_t>(*read_number(interval)) *
+                         static_cast<std::uint64_t>(*read_number(hz));
+    if (product <= microseconds_per_second) return true;
+    explain(no_sample_in_period);
+    return false;
+}
+
 // Returns the number of samples in one period. Returns nullopt with a failure report if there is no
 // period or no sample in it; an interval of 0 has none.
 std::optional<std::uint32_t> samples_per_period(std::string_view argument, std::uint32_t interval) {
-    argument.remove_suffix(unit_length);
-    const std::uint32_t hz = parse_low_32_bits(argument, "invalid frequency");
+    const std::uint32_t hz = parse_low_32_bits(without_unit(argument), "invalid frequency");
     if (!check_explained(hz, "hz", [] {
             return explanation{"the frequency is 0", "expected at least 1hz"};
         })) {
@@ -32,31 +55,46 @@ std::optional<std::uint32_t> samples_per_period(std::string_view argument, std::
     }
     const std::uint32_t product = hz * interval;
     const std::uint32_t num_samples = product == 0 ? 0 : microseconds_per_second / product;
-    if (!check_explained(num_samples, "num_samples", [] {
-            return explanation{"a period contains no sample",
-                               "expected a shorter interval or a lower frequency"};
-        })) {
-        return std::nullopt;
-    }
+    if (!check_explained(num_samples, "num_samples", no_sample_in_period)) return std::nullopt;
     return num_samples;
+}
+
+std::vector<std::string_view> generating_tags() {
+    auto tags = event_tags();
+    std::erase_if(tags,
+                  [](std::string_view tag) { return make_event(tag)->signal_types().empty(); });
+    return tags;
 }
 
 explanation unknown_signal(const VirtualEvent& event, std::string_view signal_type) {
     const auto keywords = event.signal_types();
     if (!keywords.empty()) return unknown_keyword("signal", signal_type, "expected", keywords);
-    return {event.name() + " generates no signals", "accel, gyro and compass do"};
+    return unknown_keyword("generator", event.name(), "expected", generating_tags());
 }
 
-// All sample lines leave here. Returns false if the line could not be written.
-bool write_sample(std::string line) {
-    return write_output(line.append("\n"));
+// Returns a generator of the requested signal, or null after a message if there is none.
+event_ptr make_generator(const signal_request& request) {
+    event_ptr event = make_event(request.service);
+    if (!event) {
+        print_failure(text_line().text("invalid service ").text(request.service).view());
+        explain([&] {
+            return unknown_keyword("generator", request.service, "expected", generating_tags());
+        });
+        return nullptr;
+    }
+    if (!event->init_generator(request.signal_type)) {
+        print_failure(text_line().text("invalid generator ").text(request.signal_type).view());
+        explain([&] { return unknown_signal(*event, request.signal_type); });
+        return nullptr;
+    }
+    return event;
 }
 
 }  // namespace
 
 std::optional<signal_request> read_signal_request(argument_cursor& arguments) {
     if (!check_explained(arguments.remaining() >= 4, "argc >= optind+4", [] {
-            return explanation{"generate needs SERVICE SIGNAL INTERVAL COUNT|FREQUENCYhz", ""};
+            return explanation{"generate needs SERVICE SIGNAL INTERVAL COUNT|FREQUENCYhz"};
         })) {
         return std::nullopt;
     }
@@ -75,34 +113,13 @@ std::optional<signal_request> read_signal_request(argument_cursor& arguments) {
     return request;
 }
 
-namespace {
-
-// Returns a generator of the requested signal, or null after a message if there is none.
-event_ptr make_generator(const signal_request& request) {
-    event_ptr event = make_event(request.service);
-    if (!event) {
-        print_failure(text_line().text("invalid service ").text(request.service).view());
-        explain(
-            [&] { return unknown_keyword("service", request.service, "expected", event_tags()); });
-        return nullptr;
-    }
-    if (!event->init_generator(request.signal_type)) {
-        print_failure(text_line().text("invalid generator ").text(request.signal_type).view());
-        explain([&] { return unknown_signal(*event, request.signal_type); });
-        return nullptr;
-    }
-    return event;
-}
-
-}  // namespace
-
 void generate_samples(const signal_request& request) {
     const event_ptr event = make_generator(request);
     if (!event) return;
     const block_output blocks;
     for (std::uint32_t i = 0; i < request.samples; ++i) {
-        if (!write_sample(event->generate(request.signal_type, request.interval, request.samples)))
-            return;
+        std::string line = event->generate(request.signal_type, request.interval, request.samples);
+        if (!write_output(line.append("\n"))) return;
     }
 }
 
@@ -114,12 +131,14 @@ void generate(argument_cursor& arguments) {
 
 arguments_check check_generate(argument_cursor& arguments) {
     const auto interval = arguments.peek(2);
-    auto count = arguments.peek(3);
+    const auto count = arguments.peek(3);
+    if (count && (drops_bits(*interval) || drops_bits(without_unit(*count))))
+        return arguments_check::usage_error;
     const auto request = read_signal_request(arguments);
     if (!request || !make_generator(*request)) return arguments_check::refused;
-    if (is_frequency(*count)) count->remove_suffix(unit_length);
-    const bool fits = is_32_bit_number(*interval) && is_32_bit_number(*count);
-    return fits ? arguments_check::accepted : arguments_check::misused;
+    return is_frequency(*count) && !has_whole_period(*interval, without_unit(*count))
+               ? arguments_check::usage_error
+               : arguments_check::accepted;
 }
 
 }  // namespace replay

@@ -36,7 +36,7 @@ namespace replay {
 void generate(argument_cursor& arguments);
 
 // Reads the same arguments with the same messages, and does nothing else. A number that is not one
-// of 32 bits is misused.
+// of 32 bits is a usage error, and so is a frequency whose period is not computed in 32 bits.
 arguments_check check_generate(argument_cursor& arguments);
 
 }  // namespace replay

@@ -78,9 +78,8 @@ struct load_args {
 // unknown.
 std::optional<load_args> read_load_args(argument_cursor& arguments) {
     const auto path = arguments.next();
-    if (!check_explained(path, condition::arguments_remain, [] {
-            return explanation{"load needs a sample file", ""};
-        })) {
+    if (!check_explained(path, condition::arguments_remain,
+                         [] { return explanation{"load needs FILE"}; })) {
         return std::nullopt;
     }
     load_args args{std::string(*path)};
@@ -99,9 +98,8 @@ std::optional<load_args> read_load_args(argument_cursor& arguments) {
 // Returns the service that the next argument names, or nullopt with a failure report.
 std::optional<std::string_view> read_first_service(argument_cursor& arguments) {
     const auto service = arguments.next();
-    check_explained(service, condition::arguments_remain, [] {
-        return explanation{"unload needs a service", ""};
-    });
+    check_explained(service, condition::arguments_remain,
+                    [] { return explanation{"unload needs SERVICE..."}; });
     return service;
 }
 
@@ -159,14 +157,15 @@ step_result load_file(const std::string& path, const replay_load_header& header)
     const bool success = groups.has_value();
     if (!check(success, condition::success)) return step_result::failed;
     if (groups->empty()) count_failure();
-    step_result state = step_result::success;
-    for (auto group = groups->begin(); group != groups->end() && state == step_result::success;
-         ++group)
-        state = check_service(group->first);
-    for (auto group = groups->begin(); group != groups->end() && state == step_result::success;
-         ++group)
-        state = upload(header, group->second);
-    return state;
+    for (const auto& [name, events] : *groups) {
+        const step_result result = check_service(name);
+        if (result != step_result::success) return result;
+    }
+    for (const auto& [name, events] : *groups) {
+        const step_result result = upload(header, events);
+        if (result != step_result::success) return result;
+    }
+    return step_result::success;
 }
 
 void unload_service(const service_conn& conn, std::string_view service) {
@@ -202,14 +201,15 @@ void unload(argument_cursor& arguments) {
 }
 
 arguments_check check_load(argument_cursor& arguments) {
-    return checked(read_load_args(arguments).has_value());
+    return accepted_if(read_load_args(arguments).has_value());
 }
 
 arguments_check check_unload(argument_cursor& arguments) {
-    const bool valid = read_first_service(arguments).has_value();
+    const bool has_service = read_first_service(arguments).has_value();
     while (arguments.next()) {
+        // Whether the others exist is known only when they are unloaded.
     }
-    return checked(valid);
+    return accepted_if(has_service);
 }
 
 }  // namespace nrx::replay

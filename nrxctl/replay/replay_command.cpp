@@ -32,15 +32,14 @@ void help(argument_cursor& /*arguments*/) {
     print_replay_usage();
 }
 
-constexpr auto any_number = subcommand_row::any_number;
-
 constexpr std::array subcommands{
     subcommand_row{"help", help},
     subcommand_row{"load", replay::load, 4, replay::check_load},
-    subcommand_row{"unload", replay::unload, any_number, replay::check_unload},
-    subcommand_row{"schedule-enable", replay::schedule_enable, any_number, replay::check_schedule},
-    subcommand_row{"enable", replay::enable, any_number, replay::check_services},
-    subcommand_row{"disable", replay::disable, any_number, replay::check_services},
+    subcommand_row{"unload", replay::unload, unlimited_arguments, replay::check_unload},
+    subcommand_row{"schedule-enable", replay::schedule_enable, unlimited_arguments,
+                   replay::check_schedule},
+    subcommand_row{"enable", replay::enable, unlimited_arguments, replay::check_services},
+    subcommand_row{"disable", replay::disable, unlimited_arguments, replay::check_services},
     subcommand_row{"get-status", replay::show_status},
     subcommand_row{"generate", replay::generate, 4, replay::check_generate},
 };

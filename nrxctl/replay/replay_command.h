@@ -21,7 +21,7 @@ std::span<const subcommand_row> replay_subcommands();
 
 // Reads the arguments as replay_command does, with the same messages, but does nothing else: no
 // call of the platform, and no sample file is opened. More arguments than the subcommand takes, and
-// numbers of which it would drop bits, are misused.
+// numbers of which it would drop bits, are a usage error.
 arguments_check check_replay_command(std::string_view subcommand, std::span<char* const> arguments,
                                      int& index);
 

@@ -69,7 +69,7 @@ std::vector<std::string_view> read_services(argument_cursor& arguments) {
     while (const auto service = arguments.next())
         services.push_back(*service);
     check_explained(!services.empty(), condition::arguments_remain, [] {
-        return explanation{"a service is needed", ""};
+        return explanation{"enable, disable and schedule-enable need SERVICE..."};
     });
     return services;
 }
@@ -88,9 +88,8 @@ struct schedule_args {
 // Returns nullopt with a failure report if an argument is missing.
 std::optional<schedule_args> read_schedule_args(argument_cursor& arguments) {
     const auto argument = arguments.next();
-    if (!check_explained(argument, condition::arguments_remain, [] {
-            return explanation{"schedule-enable needs SECONDS SERVICE...", ""};
-        })) {
+    if (!check_explained(argument, condition::arguments_remain,
+                         [] { return explanation{"schedule-enable needs SECONDS SERVICE..."}; })) {
         return std::nullopt;
     }
     const std::uint32_t delay = parse_low_32_bits(*argument, "invalid delay");
@@ -137,14 +136,14 @@ void schedule_enable(argument_cursor& arguments) {
 }
 
 arguments_check check_services(argument_cursor& arguments) {
-    return checked(!read_services(arguments).empty());
+    return accepted_if(!read_services(arguments).empty());
 }
 
 arguments_check check_schedule(argument_cursor& arguments) {
     const auto args = read_schedule_args(arguments);
     if (!args) return arguments_check::refused;
-    return is_32_bit_number(args->delay_argument) ? arguments_check::accepted
-                                                  : arguments_check::misused;
+    return check_32_bit_number(args->delay_argument) ? arguments_check::accepted
+                                                     : arguments_check::usage_error;
 }
 
 void show_status(argument_cursor& /*arguments*/) {

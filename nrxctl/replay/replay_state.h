@@ -51,7 +51,7 @@ void schedule_enable(argument_cursor& arguments);
 void show_status(argument_cursor& arguments);
 
 // Read the same arguments as enable, disable and schedule_enable, with the same messages, and do
-// nothing else. A delay that is not a number of 32 bits is misused.
+// nothing else. A delay that is not a number of 32 bits is a usage error.
 arguments_check check_services(argument_cursor& arguments);
 arguments_check check_schedule(argument_cursor& arguments);
 

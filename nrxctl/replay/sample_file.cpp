@@ -177,38 +177,42 @@ constexpr std::array formats{
     format_row{"PK\x03\x04", "is compressed; expand it with unzip"},
 };
 
-// Returns what is wrong with a file that begins like this, or an empty text if it may be text.
+// Returns what is wrong with a file that begins like this, or an empty text if it may be text. A
+// NUL at the very beginning tells binary files from text.
 std::string_view describe_format(std::string_view beginning) {
+    constexpr std::size_t header_size = 512;
     const auto match = std::find_if(formats.begin(), formats.end(), [&](const format_row& format) {
         return beginning.starts_with(format.magic);
     });
     if (match != formats.end()) return match->explanation;
-    return beginning.find('\0') == std::string_view::npos ? "" : "is not text";
+    return beginning.substr(0, header_size).find('\0') == std::string_view::npos ? ""
+                                                                                 : "is not text";
 }
 
-// Says in explanations which file and which line is wrong. A file that is no text is wrong as a
-// whole.
+// Says in explanations which file and which line is wrong.
 class file_position {
 public:
-    file_position(const std::string& path, std::string_view beginning)
-        : path_(path),
-          format_(describe_format(beginning)),
-          scope_([this](explanation& given) { given = describe(given); }) {}
+    explicit file_position(const std::string& path)
+        : path_(path), scope_([this](explanation& given) {
+              given.problem = std::string(text().view()).append(given.problem);
+          }) {}
 
     void next_line() { ++line_; }
 
-    // The whole file is wrong from here on.
+    // From here on explanations are about the file as a whole, as they are before the first line.
     void end_of_lines() { line_ = 0; }
 
 private:
-    [[nodiscard]] explanation describe(const explanation& given) const {
-        if (!format_.empty()) return {path_ + " " + std::string(format_), ""};
-        if (line_ == 0) return {path_ + " " + given.problem, given.expected};
-        return {path_ + ":" + std::to_string(line_) + ": " + given.problem, given.expected};
+    // "PATH:LINE: " or "PATH ".
+    [[nodiscard]] text_line text() const {
+        text_line position;
+        position.text(path_);
+        if (line_ > 0) position.text(":").number(line_).text(":");
+        position.text(" ");
+        return position;
     }
 
     const std::string& path_;
-    std::string_view format_;
     std::size_t line_ = 0;
     explanation_scope scope_;
 };
@@ -226,7 +230,13 @@ explanation no_samples() {
 std::optional<sample_groups> read_sample_file(const std::string& path) {
     const block_output blocks;
     line_reader reader(path);
-    file_position position(path, reader.beginning());
+    file_position position(path);
+    const std::string_view format = describe_format(reader.beginning());
+    if (!format.empty()) {
+        explain([&] { return explanation{std::string(format)}; });
+        count_failure();
+        return std::nullopt;
+    }
     sample_collector collector(reader.file_size());
     for (;;) {
         position.next_line();
@@ -241,8 +251,7 @@ std::optional<sample_groups> read_sample_file(const std::string& path) {
     }
     position.end_of_lines();
     if (!check_explained(reader.good(), "fs", [&] {
-            return explanation{"cannot be read: " + std::system_category().message(reader.error()),
-                               ""};
+            return explanation{"cannot be read: " + std::system_category().message(reader.error())};
         })) {
         return std::nullopt;
     }

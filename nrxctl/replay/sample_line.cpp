@@ -45,6 +45,12 @@ std::optional<sample_key> find_sample_key(std::string_view name) {
     }
 }
 
+std::string_view sample_key_name(sample_key key) {
+    constexpr std::array<std::string_view, sample_key_count> names{
+        "sampleid", "temperature", "x", "y", "z", "p", "timestamp", "shake"};
+    return names[static_cast<std::size_t>(key)];
+}
+
 void sample_values::set(std::string_view key, std::string_view value) {
     if (const auto known_key = find_sample_key(key)) set(*known_key, value);
 }

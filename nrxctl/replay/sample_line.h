@@ -17,6 +17,9 @@ inline constexpr auto sample_key_count = static_cast<std::size_t>(sample_key::co
 // Returns the key with that name, or nullopt if no event reads it.
 std::optional<sample_key> find_sample_key(std::string_view name);
 
+// Returns the name of a key.
+std::string_view sample_key_name(sample_key key);
+
 // Maps those keys to the texts of their values, which remain in the line. Every key has a slot, so
 // a line costs no allocation and no search.
 class sample_values {

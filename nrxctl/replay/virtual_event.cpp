@@ -29,13 +29,26 @@ void set_word(std::array<std::uint8_t, Size>& record, std::size_t position, std:
     store_le(record.data() + 4 * position, value);
 }
 
-std::uint32_t parse_sample(std::string_view text) {
-    return static_cast<std::uint32_t>(parse_fast_number(text, "error converting samples"));
+[[noreturn]] void reject_missing_value(sample_key key, std::string_view message) {
+    const explanation_scope scope(
+        [&](explanation& given) { given = {std::string(sample_key_name(key)) + " is missing"}; });
+    reject_number({}, message);
 }
 
-std::uint64_t parse_timestamp(std::string_view text) {
-    const auto low =
-        static_cast<std::int32_t>(parse_fast_number(text, "error converting timestamp"));
+std::int64_t parse_value(const sample_values& values, sample_key key, std::string_view message) {
+    const std::string_view text = values[key];
+    if (text.empty()) [[unlikely]]
+        reject_missing_value(key, message);
+    return parse_fast_number(text, message);
+}
+
+std::uint32_t parse_sample(const sample_values& values, sample_key key) {
+    return static_cast<std::uint32_t>(parse_value(values, key, "error converting samples"));
+}
+
+std::uint64_t parse_timestamp(const sample_values& values) {
+    const auto low = static_cast<std::int32_t>(
+        parse_value(values, sample_key::timestamp, "error converting timestamp"));
     return static_cast<std::uint64_t>(std::int64_t{low});
 }
 
@@ -55,12 +68,12 @@ void recorded_event<ValueCount>::set_delta(std::uint32_t delta) {
 template <std::size_t ValueCount>
 void recorded_event<ValueCount>::parse_record(const sample_values& values, const value_keys& keys) {
     set_word(record_, size_word, record_size);
-    set_word(record_, sampleid_word, parse_sample(values[sample_key::sampleid]));
+    set_word(record_, sampleid_word, parse_sample(values, sample_key::sampleid));
     set_word(record_, temperature_word,
-             q16_16_degrees(parse_sample(values[sample_key::temperature])));
+             q16_16_degrees(parse_sample(values, sample_key::temperature)));
     for (std::size_t i = 0; i < ValueCount; ++i)
-        set_word(record_, first_value_word + i, parse_sample(values[keys[i]]));
-    timestamp_ = parse_timestamp(values[sample_key::timestamp]);
+        set_word(record_, first_value_word + i, parse_sample(values, keys[i]));
+    timestamp_ = parse_timestamp(values);
 }
 
 bool AxisEvent::parse(const sample_values& values) {

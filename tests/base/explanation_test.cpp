@@ -14,7 +14,7 @@ TEST(explanation, is_composed_for_a_listener_alone_and_kept_once) {
         return {};
     });
     nrx::explanation_list outer;
-    nrx::explain([] { return nrx::explanation{"a", ""}; });
+    nrx::explain([] { return nrx::explanation{"a"}; });
     {
         nrx::explanation_list inner;
         nrx::explain([] { return nrx::explanation{"b", "c"}; });
@@ -22,7 +22,7 @@ TEST(explanation, is_composed_for_a_listener_alone_and_kept_once) {
         EXPECT_EQ(inner.take(), std::vector<std::string>{"b; c"});
         EXPECT_EQ(inner.take(), std::vector<std::string>());
     }
-    nrx::explain([] { return nrx::explanation{"d", ""}; });
+    nrx::explain([] { return nrx::explanation{"d"}; });
     EXPECT_EQ(outer.take(), (std::vector<std::string>{"a", "d"}));
 }
 
@@ -34,9 +34,9 @@ TEST(explanation, passes_the_scopes_from_the_inside_out) {
         const nrx::explanation_scope inner([](nrx::explanation& given) {
             given = {"inside", "x"};
         });
-        nrx::explain([] { return nrx::explanation{"a", ""}; });
+        nrx::explain([] { return nrx::explanation{"a"}; });
     }
-    nrx::explain([] { return nrx::explanation{"b", ""}; });
+    nrx::explain([] { return nrx::explanation{"b"}; });
     EXPECT_EQ(list.take(), (std::vector<std::string>{"inside outside; x", "b outside"}));
 }
 
@@ -44,7 +44,7 @@ TEST(explanation, passes_the_scopes_from_the_inside_out) {
 TEST(similar_keyword, has_the_smallest_distance) {
     constexpr std::array<std::string_view, 6> keywords{"accel", "gyro",  "compass",
                                                        "als",   "alias", "ab"};
-    for (const auto& [word, similar] : rows<std::string_view, std::string_view>{
+    for (const auto& [argument, similar] : rows<std::string_view, std::string_view>{
              {"acel", "accel"},
              {"accele", "accel"},
              {"axxel", "accel"},
@@ -58,7 +58,7 @@ TEST(similar_keyword, has_the_smallest_distance) {
              {"a", "ab"},
              {"", ""},
          })
-        EXPECT_EQ(nrx::most_similar(word, keywords), similar) << word;
+        EXPECT_EQ(nrx::most_similar(argument, keywords), similar) << argument;
 }
 
 }  // namespace tests

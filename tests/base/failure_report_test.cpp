@@ -87,17 +87,16 @@ TEST(failure_count, counts_reports_and_lines_that_state_a_failure) {
 }
 
 TEST(end_process, ends_only_the_action_and_flushes_output) {
-    bool completed = true;
-    const auto result = capture([&] {
-        const nrx::block_output blocks;
-        nrx::print_line("before");
-        completed = nrx::run_to_completion([] { nrx::end_process(); });
-        nrx::print_line("after");
+    nrx::memory_sink out;
+    const nrx::scoped_sink installed(nrx::standard_stream::output, out);
+    const nrx::block_output blocks;
+    nrx::print_line("before");
+    EXPECT_FALSE(nrx::run_to_completion([] {
+        EXPECT_FALSE(nrx::run_to_completion([] { nrx::end_process(); }));
+        EXPECT_TRUE(nrx::run_to_completion([] {}));
         nrx::end_process();
-    });
-    EXPECT_FALSE(completed);
-    EXPECT_EQ(result.out, "before\nafter\n");
-    EXPECT_EQ(result.status, 1);
+    }));
+    EXPECT_EQ(out.text(), "before\n");
 }
 
 }  // namespace

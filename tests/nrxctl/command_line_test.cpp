@@ -8,12 +8,12 @@ namespace tests {
 using command_line = options_host;
 
 TEST_F(command_line, that_is_wrong_ends_with_status_2) {
-    const std::string expected_u32 = " is out of range; expected 0 to 4294967295";
+    const std::string expected_u32 = " is out of range; expected a number from 0 to 4294967295";
     const std::string wanted_before =
-        " must stand before --report, --command, --get-property or "
+        " must come before --report, --command, --get-property or "
         "--hid-driver";
     const std::string watches =
-        "--count must stand before --events, --scm, --spi-status or a run "
+        "--count must come before --events, --scm, --spi-status or a run "
         "or monitor of "
         "--profile";
     for (const auto& [arguments, message] : rows<std::string, std::string>{
@@ -40,6 +40,7 @@ TEST_F(command_line, that_is_wrong_ends_with_status_2) {
              {"--set-property accel gain u8", "a value is missing"},
              {"--hid-driver --list", "--hid-driver needs [u8|u16|u32] VALUE..."},
              {"--hid-driver u32", "a value is missing"},
+             {"--command arc 1 u8", "a value is missing"},
              {"--mca", "--mca needs on|off"},
              {"--spi-status accel", "--spi-status needs SERVICE MODE"},
              {"--count", "--count needs N"},
@@ -68,35 +69,38 @@ TEST_F(command_line, that_is_wrong_ends_with_status_2) {
              {"--report accel 256", "\"256\" is not a report id; expected a number from 0 to 255"},
              {"--set-report accel 0x100 1",
               "\"0x100\" is not a report id; expected a number from 0 to 255"},
-             {"--set-report arc 0xd0 1 -5", "\"-5\" is no value; none begins with a minus sign"},
+             {"--set-report arc 0xd0 1 -5", "\"-5\" is not a value; values cannot be negative"},
              {"--report accel 1 0x100001",
-              "\"0x100001\" is not a capacity; expected a number from 0 to 1048576"},
+              "\"0x100001\" is not a capacity; expected a number from 1 to 1048576"},
+             {"--report accel 1 0", "\"0\" is not a capacity; expected a number from 1 to 1048576"},
              {"--command accel 0x100000000",
               "\"0x100000000\" is not a command code; expected a number from 0 to 4294967295"},
              {"--sensor accel 0x80000000",
               "\"0x80000000\" is not a level; expected a number from 0 to 2147483647"},
              {"--scalar arc 5 -1",
-              "\"-1\" is no scalar; expected a number from 0 to 9223372036854775807"},
+              "\"-1\" is not a scalar; expected a number from 0 to 9223372036854775807"},
              {"--scalar accel 1 x",
-              "\"x\" is no scalar; expected a number from 0 to 9223372036854775807"},
+              "\"x\" is not a scalar; expected a number from 0 to 9223372036854775807"},
              {"--spi-status accel 4294967296",
               "\"4294967296\" is not a mode; expected a number from 0 to 4294967295"},
              {"--events 2147483648",
               "\"2147483648\" is not a number of seconds; expected a number from 0 to 2147483647"},
-             {"--mca On", "\"On\" is no state; expected on or off"},
-             {"--profile config", "a configuration is needed, such as sensor:accel"},
+             {"--mca On", "\"On\" is not a state; expected on or off"},
+             {"--profile config", "config needs CONFIG..., such as sensor:accel"},
              {"--replay generate accel sin 100 -3", "\"-3\"" + expected_u32},
              {"--replay generate accel sin -1 3", "\"-1\"" + expected_u32},
              {"--replay generate accel sin 4294967297 1hz", "\"4294967297\"" + expected_u32},
+             {"--replay generate accel sin 100 -1hz", "\"-1\"" + expected_u32},
+             {"--replay generate accel sin 65537 65536hz",
+              "a period contains no sample; expected a shorter interval or a lower frequency"},
              {"--replay schedule-enable -5 accel", "\"-5\"" + expected_u32},
              // settings
-             {"--count 0 --events", "the count is 0; expected at least 1"},
-             {"--count x --events", "\"x\" is not a count; expected a number from 0 to 4294967295"},
+             {"--count 0 --events", "\"0\" is not a count; expected a number from 1 to 4294967295"},
+             {"--count x --events", "\"x\" is not a count; expected a number from 1 to 4294967295"},
              {"--events --count 5", watches},
-             {"--count 5 --count 6 --events", watches},
              {"--count 5 --profile get-logs", watches},
              {"--hex --list", "--hex" + wanted_before},
-             {"--raw --hex --report arc 0xd0", "--raw" + wanted_before},
+             {"--raw --count 2 --events", "--raw" + wanted_before},
          }) {
         const auto result = run(arguments);
         EXPECT_EQ(result.status, 2) << arguments;
@@ -108,22 +112,25 @@ TEST_F(command_line, that_is_wrong_ends_with_status_2) {
 
 TEST_F(command_line, that_the_library_refuses_ends_with_status_1) {
     const std::string no_duration =
-        " is no duration; expected auto, or milliseconds from 0 to 4294967";
+        " is not a duration; expected auto, or milliseconds from 0 to 4294967";
     const std::string sensor_has =
         "; sensor has: accel gyro compass pressure gostin als temperature";
     for (const auto& [arguments, out, reports, message] :
          rows<std::string, std::string, std::size_t, std::string>{
              {"--set-report arc 1 zz", "payload value is invalid (zz)\n", 0,
-              "\"zz\" is no value; expected hexadecimal digits up to 7fffffff, or 0d and decimal "
+              "\"zz\" is not a value; expected hexadecimal digits up to 7fffffff, or 0d and "
+              "decimal "
               "ones"},
              {"--command arc 1 100", "Value 256 (0100) is bigger than allowed (255, 0xff)\n", 0,
-              "256 does not fit the width of the values; u8, u16 or u32 before the first one sets "
+              "\"100\" does not fit the width of the values; u8, u16 or u32 before the first one "
+              "sets "
               "it"},
              {"--profile config sensor:acel:data", "", 4,
               "unknown component \"acel\" in \"sensor:acel:data\"" + sensor_has +
                   " (did you mean accel?)"},
              {"--profile config sensor:gyro trace:foo", "component is invalid (foo)\n", 0,
-              "unknown component \"foo\" in \"trace:foo\"; trace has a number or: remoteq endpoint "
+              "unknown component \"foo\" in \"trace:foo\"; trace takes a number or: remoteq "
+              "endpoint "
               "systick interrupt mbi"},
              {"--profile config sensr:accel", "", 3,
               "unknown profiler \"sensr\" in \"sensr:accel\"; expected: exec trace sensor orrin "
@@ -132,8 +139,7 @@ TEST_F(command_line, that_the_library_refuses_ends_with_status_1) {
               "unknown report \"wake-stats\" in \"wake:wake:wake-stats\"; expected a mask or: all "
               "wake-req-stats wake-req-info wake-event-info (did you mean wake-req-stats?)"},
              {"--profile config exec:thread,command", "", 3,
-              "not one component in \"exec:thread,command\"; each of \"exec\" needs an argument of "
-              "its own"},
+              "not one component in \"exec:thread,command\"; exec takes one for each argument"},
              {"--profile set-config sensor", "", 2,
               "wrong number of fields in \"sensor\"; expected "
               "PROFILER:COMPONENTS[:REPORTS[:SERVICES]]"},
@@ -141,8 +147,7 @@ TEST_F(command_line, that_the_library_refuses_ends_with_status_1) {
               "too many services in \"trace:mbi:all:a,b,c,d,e,f,g,h,i\"; expected at most 8"},
              {"--profile on-error foo", "invalid argument: foo\n", 0,
               "unknown action \"foo\"; expected: panic nothing"},
-             {"--profile on-error", "invalid argument: \n", 0,
-              "unknown action \"\"; expected: panic nothing"},
+             {"--profile on-error", "invalid argument: \n", 0, "on-error needs panic|nothing"},
              {"--profile get-logs fwdmp", "Invalid parameter\n", 1,
               "unknown argument \"fwdmp\"; expected: errdump fwdump human (did you mean fwdump?)"},
              {"--profile monitor 5s", "duration parameter is invalid (5s)\n", 0,
@@ -162,31 +167,31 @@ TEST_F(command_line, that_the_library_refuses_ends_with_status_1) {
                   " (did you mean accel?)"},
              {"--profile auto human sensor:accel",
               "duration=0 us mode=auto (humanReadable=disabled)\n", 2,
-              "human must stand before the duration"},
-             {"--scm 300", "", 1, "no configuration; expected one, such as scm:smb0"},
+              "human must come before the duration"},
+             {"--scm 300", "", 1, "--scm needs CONFIG..., such as scm:smb0"},
              {"--scm x scm:spi0", "duration parameter is invalid (x)\n", 0, "\"x\"" + no_duration},
              {"--scm 1 scm:spi9", "component is invalid (spi9)\n", 0,
-              "unknown component \"spi9\" in \"scm:spi9\"; scm has a number or: spi0 smb0 smb1 "
+              "unknown component \"spi9\" in \"scm:spi9\"; scm takes a number or: spi0 smb0 smb1 "
               "i2cm0 i2c_ctrl0 i2c_ctrl1 (did you mean spi0?)"},
-             {"--replay load", "", 1, "load needs a sample file"},
+             {"--replay load", "", 1, "load needs FILE"},
              {"--replay load f lats", "Invalid completion: lats\n", 0,
               "unknown completion \"lats\"; expected: default periodic stop last (did you mean "
               "last?)"},
              {"--replay load f filter last ram", "Invalid location: ram\n", 0,
               "unknown location \"ram\"; expected: dram sram local (did you mean dram?)"},
-             {"--replay unload", "", 1, "unload needs a service"},
-             {"--replay enable", "", 1, "a service is needed"},
+             {"--replay unload", "", 1, "unload needs SERVICE..."},
+             {"--replay enable", "", 1, "enable, disable and schedule-enable need SERVICE..."},
              {"--replay schedule-enable", "", 1, "schedule-enable needs SECONDS SERVICE..."},
              {"--replay schedule-enable x accel", "invalid delay (x)\n", 0,
-              "\"x\" is no number; expected decimal digits, or 0x and hexadecimal ones"},
+              "\"x\" is not a number; expected decimal digits, or 0x and hexadecimal ones"},
              {"--replay generate accel sin 1", "", 1,
               "generate needs SERVICE SIGNAL INTERVAL COUNT|FREQUENCYhz"},
              {"--replay generate foo sin 1 3", "invalid service foo\n", 0,
-              "unknown service \"foo\"; expected: accel gyro compass pressure"},
+              "unknown generator \"foo\"; expected: accel gyro compass"},
              {"--replay generate accel sine 1 3", "invalid generator sine\n", 0,
               "unknown signal \"sine\"; expected: random delta step sin (did you mean sin?)"},
              {"--replay generate pressure sin 1 3", "invalid generator sin\n", 0,
-              "pressure generates no signals; accel, gyro and compass do"},
+              "unknown generator \"pressure\"; expected: accel gyro compass"},
              {"--replay generate accel sin 1 0hz", "", 1,
               "the frequency is 0; expected at least 1hz"},
              {"--replay generate accel sin 1000000 2hz", "", 1,

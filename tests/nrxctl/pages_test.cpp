@@ -16,6 +16,7 @@
 #include "nrxctl/replay/virtual_event.h"
 #include "tests/support/argument_vector.h"
 #include "tests/support/capture.h"
+#include "tests/support/program.h"
 
 namespace tests {
 
@@ -71,7 +72,7 @@ lines tags(const std::string& file, const std::string& name) {
     return entries;
 }
 
-std::string first_word(const std::string& text) {
+std::string first_token(const std::string& text) {
     return text.substr(0, text.find(' '));
 }
 
@@ -80,7 +81,7 @@ text_set keywords_on_page(const std::string& file, const std::string& name) {
     text_set keywords;
     for (const std::string& tag : tags(file, name)) {
         for (const std::string& part : split(tag, ','))
-            keywords.insert(first_word(part.substr(part.find_first_not_of(' '))));
+            keywords.insert(first_token(part.substr(part.find_first_not_of(' '))));
     }
     return keywords;
 }
@@ -108,7 +109,8 @@ text_set usage_keywords(const std::string& usage, const std::string& option) {
     text_set keywords;
     const std::string beginning = "    nrxctl --" + option + " ";
     for (const std::string& line : split(usage, '\n')) {
-        if (line.starts_with(beginning)) keywords.insert(first_word(line.substr(beginning.size())));
+        if (line.starts_with(beginning))
+            keywords.insert(first_token(line.substr(beginning.size())));
     }
     return keywords;
 }
@@ -120,11 +122,27 @@ std::string usage_of(void (*command)(std::string_view, std::span<char* const>, i
 
 }  // namespace
 
+TEST(pages, synopsis_is_the_usage) {
+    const auto synopsis = [](const std::string& file) {
+        std::string text = "usage:";
+        for (const std::string& line : section(file, "SYNOPSIS"))
+            text.append(" ").append(plain(line));
+        return text + "\n";
+    };
+    EXPECT_TRUE(run_program(NRXCTL_PROGRAM, {"--help"}).out.starts_with(synopsis("nrxctl.1")));
+    std::string usage = run_program(KEYPROBE_PROGRAM, {"--help"}).err;
+    const std::string path = KEYPROBE_PROGRAM;
+    usage.replace(usage.find(path), path.size(), "keyprobe");
+    EXPECT_EQ(usage, synopsis("keyprobe.1"));
+    EXPECT_EQ(tags("keyprobe.1", "OPTIONS"), (lines{"--collectall", "--help"}));
+}
+
 TEST(pages, options_are_those_of_the_table) {
     text_set usages;
     for (const nrx::nrxctl::option_row& row : nrx::nrxctl::option_table()) {
-        std::string usage = "--" + std::string(row.name);
-        if (!row.arguments.empty()) usage += " " + std::string(row.arguments);
+        std::string usage("--");
+        usage.append(row.name);
+        if (!row.arguments.empty()) usage.append(" ").append(row.arguments);
         usages.insert(usage);
     }
     const lines entries = tags("nrxctl.1", "OPTIONS");

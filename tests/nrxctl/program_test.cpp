@@ -7,8 +7,12 @@
 #include <cstdio>
 #include <ctime>
 #include <fcntl.h>
+#include <poll.h>
+#include <sys/ioctl.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
+#include <sys/wait.h>
+#include <thread>
 #include <unistd.h>
 
 #include <gtest/gtest.h>
@@ -33,7 +37,6 @@ program_result run(const std::string& arguments, output_target target = output_t
 TEST(nrxctl_program, ends_with_the_status_of_its_options) {
     EXPECT_EQ(run("--version").status, 0);
     EXPECT_EQ(run("--report nobody 1 --version").status, 1);
-    EXPECT_EQ(run("--mca On").status, 2);
     EXPECT_EQ(run("--version --foo").status, 2);
 }
 
@@ -97,7 +100,9 @@ TEST(nrxctl_program, waits_without_using_the_processor_and_ends_in_order) {
     for (const auto& [arguments, awaited, end] : watches) {
         running_program watch(program, split(arguments));
         ASSERT_TRUE(watch.wait_for(awaited)) << arguments;
-        watch.send_signal(std::array{SIGINT, SIGTERM, SIGHUP}.at(number++ % 3));
+        const int signal = std::array{SIGINT, SIGTERM, SIGHUP}.at(number++ % 3);
+        watch.send_signal(signal);
+        watch.send_signal(signal);  // as a program that signals a process and its group does
         EXPECT_EQ(watch.finish(), 0) << arguments;
         EXPECT_TRUE(watch.out().ends_with(end)) << arguments;
         EXPECT_LT(watch.processor_time(), 0.1) << arguments;
@@ -147,19 +152,46 @@ TEST(nrxctl_program, is_ended_by_an_interrupt_after_a_watch) {
 
 // Generating four billion lines would take hours.
 TEST(nrxctl_program, fails_if_output_is_lost_but_not_without_a_reader) {
-    for (const auto& [target, status] : rows<output_target, int>{{output_target::closed_pipe, 0},
-                                                                 {output_target::full_device, 1},
-                                                                 {output_target::closed, 1}}) {
-        for (const char* arguments : {"--list", "--profile human 60 sensor:accel",
+    const std::string lost = "nrxctl: output was lost: ";
+    for (const auto& [target, status, err] : rows<output_target, int, std::string>{
+             {output_target::closed_pipe, 0, ""},
+             {output_target::full_device, 1, lost + "No space left on device\n"},
+             {output_target::closed, 1, lost + "Bad file descriptor\n"}}) {
+        for (const char* arguments : {"--list", "--profile human 60 sensor:accel", "--events 1",
                                       "--replay generate accel sin 1 4294967295"}) {
             const auto result = run(arguments, target);
             EXPECT_EQ(result.status, status) << arguments;
-            EXPECT_EQ(result.err, "") << arguments;
+            EXPECT_EQ(result.err, err) << arguments;
+            EXPECT_LT(result.processor_time, 0.2) << arguments;
         }
     }
 }
 
-// The profiler is disabled in order all the same.
+// Its reader does not read: the pipe is full.
+TEST(nrxctl_program, ends_a_watch_that_is_blocked_in_a_write) {
+    std::array<int, 2> ends{};
+    ASSERT_EQ(::pipe2(ends.data(), O_CLOEXEC), 0);
+    ::fcntl(ends[1], F_SETPIPE_SZ, 4096);
+    const int err = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
+    const pid_t watch =
+        start_program(program, split("--profile human auto sensor:accel"), ends[1], err);
+    ::close(err);
+    // Another line of 400 characters and more does not fit.
+    for (int size = 0; size < 4096 - 400; ::ioctl(ends[0], FIONREAD, &size))
+        std::this_thread::yield();
+    ::close(ends[1]);
+    // As by a user who presses Ctrl-C again and again. The one that ends the write comes in time.
+    siginfo_t end{};
+    while (::waitid(P_PID, static_cast<id_t>(watch), &end, WEXITED | WNOHANG | WNOWAIT) == 0 &&
+           end.si_pid == 0) {
+        ::kill(watch, SIGINT);
+        ::poll(nullptr, 0, 20);
+    }
+    EXPECT_EQ(wait_for(watch).status, 1);
+    ::close(ends[0]);
+}
+
+// The run goes on to its end, and so do the options after it.
 TEST(nrxctl_program, fails_beyond_the_limit_of_a_files_size) {
     const rlimit limit{.rlim_cur = 512, .rlim_max = RLIM_INFINITY};
     rlimit previous{};
@@ -169,7 +201,9 @@ TEST(nrxctl_program, fails_beyond_the_limit_of_a_files_size) {
     ::setrlimit(RLIMIT_FSIZE, &previous);
     EXPECT_EQ(result.status, 1);
     EXPECT_EQ(result.out.size(), 512U);
-    EXPECT_EQ(result.err, "nrxctl: no service \"nosuch\"; --list shows all\n");
+    EXPECT_EQ(result.err,
+              "nrxctl: no service \"nosuch\"; --list shows all\n"
+              "nrxctl: output was lost: File too large\n");
 }
 
 }  // namespace

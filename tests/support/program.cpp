@@ -4,6 +4,7 @@
 #include <fcntl.h>
 #include <future>
 #include <sys/mman.h>
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -43,12 +44,6 @@ std::string joined(const std::vector<std::string>& pieces) {
     return text;
 }
 
-int wait_for(pid_t child) {
-    int status = 0;
-    ::waitpid(child, &status, 0);
-    return WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
-}
-
 // Opens what the program writes to, and the end to read from if there is one.
 pipe_ends open_target(output_target target) {
     switch (target) {
@@ -72,6 +67,17 @@ pipe_ends open_target(output_target target) {
 }
 
 }  // namespace
+
+process_end wait_for(pid_t child) {
+    int status = 0;
+    rusage usage{};
+    ::wait4(child, &status, 0, &usage);
+    const auto seconds = [](const timeval& time) {
+        return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
+    };
+    return {WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status),
+            seconds(usage.ru_utime) + seconds(usage.ru_stime)};
+}
 
 pid_t start_program(const std::string& path, const std::vector<std::string>& arguments, int out,
                     int err) {
@@ -106,7 +112,8 @@ program_result run_program(const std::string& path, const std::vector<std::strin
     std::string text;
     if (out.read_end >= 0) text = joined(read_pieces(out.read_end));
     const std::string error_text = errors.get();
-    return {wait_for(child), text, error_text};
+    const process_end end = wait_for(child);
+    return {end.status, text, error_text, end.processor_time};
 }
 
 std::vector<std::string> record_writes(const std::string& path,

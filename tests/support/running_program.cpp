@@ -5,7 +5,6 @@
 #include <csignal>
 #include <fcntl.h>
 #include <poll.h>
-#include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
 #include <utility>
@@ -13,14 +12,6 @@
 #include "tests/support/program.h"
 
 namespace tests {
-
-namespace {
-
-double seconds(const timeval& time) {
-    return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
-}
-
-}  // namespace
 
 running_program::running_program(const std::string& path,
                                  const std::vector<std::string>& arguments) {
@@ -73,12 +64,10 @@ void running_program::stop_reading() {
 int running_program::finish() {
     while (read_more()) {
     }
-    int status = 0;
-    rusage usage{};
-    ::wait4(child_, &status, 0, &usage);
+    const process_end end = tests::wait_for(child_);
     child_ = -1;
-    processor_time_ = seconds(usage.ru_utime) + seconds(usage.ru_stime);
-    return WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
+    processor_time_ = end.processor_time;
+    return end.status;
 }
 
 }  // namespace tests
