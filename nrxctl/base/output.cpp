@@ -25,7 +25,7 @@ line_sink*& installed(standard_stream stream) {
     return stream == standard_stream::output ? output_sink : error_sink;
 }
 
-// Waits until a failed write can be retried: not at all after a signal, otherwise until a full pipe
+// Waits until a failed write can be retried: at once after a signal, otherwise when a full pipe
 // accepts more. Returns false if the error is final, or after an interrupt.
 bool wait_to_retry(int descriptor, int error) {
     if (platform::interrupt_received()) return false;
